@@ -1,0 +1,39 @@
+#ifndef PLATFORM_H
+#define PLATFORM_H
+
+// The one place where the process touches the device: every "/opt/..." and
+// "/sys/..." path is resolved under a root prefix, and every shell command or
+// external program goes through here. A host build never runs them; it logs
+// and records them so that tests can see what would have happened.
+
+#include <QString>
+#include <QStringList>
+
+namespace Platform {
+
+// Root prefix for device paths. Taken from MARIGOLD_ROOT on first use,
+// default "/". Tests may override it.
+QString root();
+void setRoot(const QString& root);
+
+// "/opt/GUI/Sounds/x.wav" -> "<root>/opt/GUI/Sounds/x.wav"
+QString devicePath(const QString& absolutePath);
+
+// True when built for the instrument (commands really run).
+bool isDeviceBuild();
+
+// system() on the device, a log line and a record on the host.
+// Returns the command's exit status on the device and 0 on the host.
+int runShellCommand(const QString& command);
+
+// Starts an external program without waiting for it (aplay). The program's
+// own result is not looked at.
+void startProgram(const QString& program, const QStringList& arguments);
+
+// What a host build would have run, oldest first ("aplay -N /opt/...").
+QStringList recordedCommands();
+void clearRecordedCommands();
+
+} // namespace Platform
+
+#endif // PLATFORM_H

@@ -1,0 +1,49 @@
+#include "AppShell.h"
+#include "MyApplication.h"
+
+#include <QDebug>
+#include <QLabel>
+#include <QTextCodec>
+#include <QThread>
+
+int main(int argc, char* argv[])
+{
+    // 1, 2
+    MyApplication app(argc, argv);
+    app.setApplicationName("MarigoldGUIApp");
+
+    // 3
+    // argc is what is left after the toolkit took its own options.
+    QStringList arguments;
+    for (int i = 0; i < argc; ++i)
+        arguments << QString::fromLocal8Bit(argv[i]);
+    AppShell::applyAddressArgument(arguments);
+
+    // 4
+    AppShell::writeVersionFile(QCoreApplication::applicationDirPath());
+
+    // 5
+    AppShell::registerMetaTypes();
+
+    // 6: every toLocal8Bit() on the wire depends on this.
+    QTextCodec::setCodecForLocale(QTextCodec::codecForName("utf8"));
+
+    // 7, 8: singletons and their Init() calls join here as they are built.
+
+    // 9
+    QThread::currentThread()->setPriority(QThread::HighPriority);
+    qDebug() << QString("Main/GUI Thread is Running: %1")
+                    .arg(reinterpret_cast<quintptr>(QThread::currentThreadId()));
+
+    // 10: the screen stack replaces this window once it exists.
+    QLabel screen("MarigoldGUIApp");
+    screen.setAlignment(Qt::AlignCenter);
+    screen.resize(320, 480);
+    screen.showFullScreen();
+
+    // 11
+    AppShell::hidePointer();
+
+    // 12
+    return app.exec();
+}
