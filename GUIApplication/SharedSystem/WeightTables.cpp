@@ -1,0 +1,28 @@
+#include "SharedSystem/WeightTables.h"
+
+#include "SharedSystem/WeightTables.inc"
+
+std::atomic<const XYZ_WEIGHTS_T*> pILLOBS_TABLE{ILLOBS_WEIGHTS_TABLE5};
+std::atomic<const XYZN_T*> pXYZN{XYZN_TABLE5};
+
+void WeightTable_SelectColorTable(int table)
+{
+    if (table == COLOR_TABLE_6) {
+        pILLOBS_TABLE = ILLOBS_WEIGHTS_TABLE6;
+        pXYZN = XYZN_TABLE6;
+    } else {
+        pILLOBS_TABLE = ILLOBS_WEIGHTS_TABLE5;
+        pXYZN = XYZN_TABLE5;
+    }
+}
+
+bool WeightTable_IsXRowWrapped(const XYZ_WEIGHTS_T* table, int illumobsnr)
+{
+    return table == ILLOBS_WEIGHTS_TABLE5 && (illumobsnr == F12_2 || illumobsnr == F12_10);
+}
+
+int32_t WeightTable_XWeight(const XYZ_WEIGHTS_T* table, int illumobsnr, int index)
+{
+    const int32_t stored = table[illumobsnr].XWeight[index];
+    return WeightTable_IsXRowWrapped(table, illumobsnr) ? WeightTable_UnwrapXWeight(stored) : stored;
+}
