@@ -423,7 +423,7 @@ void appendRow(std::string& out, const std::vector<long long>& values)
     out += "        {";
     for (size_t i = 0; i < values.size(); ++i) {
         if (i > 0)
-            out += i % 8 == 0 ? ",\n         " : ",";
+            out += i % 8 == 0 ? ",\n         " : ", ";
         char buf[16];
         std::snprintf(buf, sizeof buf, "%6lld", values[i]);
         out += buf;
