@@ -15,14 +15,3 @@ void WeightTable_SelectColorTable(int table)
         pXYZN = XYZN_TABLE5;
     }
 }
-
-bool WeightTable_IsXRowWrapped(const XYZ_WEIGHTS_T* table, int illumobsnr)
-{
-    return table == ILLOBS_WEIGHTS_TABLE5 && (illumobsnr == F12_2 || illumobsnr == F12_10);
-}
-
-int32_t WeightTable_XWeight(const XYZ_WEIGHTS_T* table, int illumobsnr, int index)
-{
-    const int32_t stored = table[illumobsnr].XWeight[index];
-    return WeightTable_IsXRowWrapped(table, illumobsnr) ? WeightTable_UnwrapXWeight(stored) : stored;
-}

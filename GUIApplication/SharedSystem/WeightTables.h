@@ -49,7 +49,10 @@ void WeightTable_SelectColorTable(int table);
 // The X rows of F12_2 and F12_10 in set 5 are held as 16-bit values (their
 // 610 nm weight exceeds 32767 thousandths): an entry below -1000 stands for
 // itself plus 65536. True when that reading applies to a row of `table`.
-bool WeightTable_IsXRowWrapped(const XYZ_WEIGHTS_T* table, int illumobsnr);
+inline bool WeightTable_IsXRowWrapped(const XYZ_WEIGHTS_T* table, int illumobsnr)
+{
+    return table == ILLOBS_WEIGHTS_TABLE5 && (illumobsnr == F12_2 || illumobsnr == F12_10);
+}
 
 inline int32_t WeightTable_UnwrapXWeight(int32_t stored)
 {
@@ -57,6 +60,10 @@ inline int32_t WeightTable_UnwrapXWeight(int32_t stored)
 }
 
 // The X weight at a wavelength index, read by the rule above.
-int32_t WeightTable_XWeight(const XYZ_WEIGHTS_T* table, int illumobsnr, int index);
+inline int32_t WeightTable_XWeight(const XYZ_WEIGHTS_T* table, int illumobsnr, int index)
+{
+    const int32_t stored = table[illumobsnr].XWeight[index];
+    return WeightTable_IsXRowWrapped(table, illumobsnr) ? WeightTable_UnwrapXWeight(stored) : stored;
+}
 
 #endif // WEIGHTTABLES_H

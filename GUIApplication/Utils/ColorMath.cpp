@@ -92,16 +92,10 @@ void sumWeights(const double* refls, const XYZ_WEIGHTS_T& w, double* X, double* 
     *Z = z;
 }
 
-} // namespace
-
-int ColorMath_GetNumIlluminantObservers()
-{
-    return eILLUM_OBS_NumOf;
-}
-
-// ---- Spectrum to coordinates ------------------------------------------------
-
-bool_t ColorMath_ReflToXYZ(const double* refls, int illumobsnr, XYZCOORD* pXYZ)
+// The screen path (spectrum, XYZ, RGB) runs at every repaint of a colour
+// patch; these bodies are called directly, not through the exported
+// symbols, so that the compiler can inline them.
+bool reflToXYZ(const double* refls, int illumobsnr, XYZCOORD* pXYZ)
 {
     if (!refls || !pXYZ || !validPair(illumobsnr))
         return false;
@@ -118,6 +112,44 @@ bool_t ColorMath_ReflToXYZ(const double* refls, int illumobsnr, XYZCOORD* pXYZ)
     pXYZ->Y = Y < 0.0 ? 0.0 : Y;
     pXYZ->Z = Z < 0.0 ? 0.0 : Z;
     return true;
+}
+
+bool xyzToRGB(const XYZCOORD* xyz, COLOR_REF* pcr)
+{
+    if (!xyz || !pcr)
+        return false;
+    // Not normalised to any white: a perfect white saturates all three.
+    double linear[3] = {
+        0.056507956 * xyz->X - 0.027365549 * xyz->Y - 0.008413978 * xyz->Z,
+        -0.014958500 * xyz->X + 0.026018254 * xyz->Y + 0.000538549 * xyz->Z,
+        0.000739082 * xyz->X - 0.002633301 * xyz->Y + 0.012043483 * xyz->Z,
+    };
+    const double top = double(0.999f);
+    COLOR_REF cr = 0;
+    for (int k = 0; k < 3; ++k) {
+        // Clamped without branches (they would mispredict on real colours);
+        // NaN goes to 0.
+        double v = linear[k] >= 0.0 ? linear[k] : 0.0;
+        v = v > top ? top : v;
+        const int32_t index = ColorMathHelper_Round(v * 1000.0);
+        cr += COLOR_REF(FGAMMA[index < 999 ? index : 999]) << (8 * k);
+    }
+    *pcr = cr;
+    return true;
+}
+
+} // namespace
+
+int ColorMath_GetNumIlluminantObservers()
+{
+    return eILLUM_OBS_NumOf;
+}
+
+// ---- Spectrum to coordinates ------------------------------------------------
+
+bool_t ColorMath_ReflToXYZ(const double* refls, int illumobsnr, XYZCOORD* pXYZ)
+{
+    return reflToXYZ(refls, illumobsnr, pXYZ);
 }
 
 bool_t ColorMath_ReflToXYZs(const double* refls, int illumobsnr, double* pX, double* pY, double* pZ)
@@ -217,7 +249,7 @@ bool_t ColorMath_ReflToCIEYuv(const double* refls, int illumobsnr, CIEYUVCOORD* 
 bool_t ColorMath_ReflToRGB(const double* refls, int illumobsnr, COLOR_REF* pcr)
 {
     XYZCOORD xyz;
-    return pcr && ColorMath_ReflToXYZ(refls, illumobsnr, &xyz) && ColorMath_XYZtoRGB(&xyz, pcr);
+    return pcr && reflToXYZ(refls, illumobsnr, &xyz) && xyzToRGB(&xyz, pcr);
 }
 
 // ---- XYZ to coordinates ---------------------------------------------------------
@@ -358,29 +390,7 @@ bool_t ColorMath_XYZToHunterLab(const XYZCOORD* pXYZ, int illumobsnr, HUNTERLABC
 
 bool_t ColorMath_XYZtoRGB(const XYZCOORD* xyz, COLOR_REF* pcr)
 {
-    if (!xyz || !pcr)
-        return false;
-    // Not normalised to any white: a perfect white saturates all three.
-    double linear[3] = {
-        0.056507956 * xyz->X - 0.027365549 * xyz->Y - 0.008413978 * xyz->Z,
-        -0.014958500 * xyz->X + 0.026018254 * xyz->Y + 0.000538549 * xyz->Z,
-        0.000739082 * xyz->X - 0.002633301 * xyz->Y + 0.012043483 * xyz->Z,
-    };
-    const double top = double(0.999f);
-    COLOR_REF cr = 0;
-    for (int k = 0; k < 3; ++k) {
-        double v = linear[k];
-        if (!(v >= 0.0)) // also NaN
-            v = 0.0;
-        if (v > top)
-            v = top;
-        int32_t index = ColorMathHelper_Round(v * 1000.0);
-        if (index > 999)
-            index = 999;
-        cr += COLOR_REF(FGAMMA[index]) << (8 * k);
-    }
-    *pcr = cr;
-    return true;
+    return xyzToRGB(xyz, pcr);
 }
 
 // ---- Back conversions -------------------------------------------------------------

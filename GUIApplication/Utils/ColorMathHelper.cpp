@@ -3,7 +3,6 @@
 #include "SharedSystem/WeightTables.h"
 
 #include <cmath>
-#include <limits>
 
 namespace {
 
@@ -13,23 +12,6 @@ thread_local double fKSAdjusted[NUM_WAVELENGTHS];
 thread_local double fRAdjusted[NUM_WAVELENGTHS];
 
 } // namespace
-
-int32_t ColorMathHelper_Round(double f)
-{
-    if (std::isnan(f))
-        return 0;
-    double whole = std::trunc(f);
-    const double fraction = f - whole; // exact for every double
-    if (fraction >= 0.5)
-        whole += 1.0;
-    else if (fraction <= -0.5)
-        whole -= 1.0;
-    if (whole >= double(std::numeric_limits<int32_t>::max()))
-        return std::numeric_limits<int32_t>::max();
-    if (whole <= double(std::numeric_limits<int32_t>::min()))
-        return std::numeric_limits<int32_t>::min();
-    return int32_t(whole);
-}
 
 double ColorMathHelper_Round6(double f)
 {
