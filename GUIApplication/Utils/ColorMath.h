@@ -74,6 +74,13 @@ typedef struct _RXRYRZCOORD {
 // The display curve: linear light x 1000 (0-999) to an 8-bit level.
 extern const unsigned char FGAMMA[1000];
 
+// Status density weights: the entry for a status, response and wavelength
+// index i stands at status x 124 + response x 31 + i. Rows exist for status
+// A, E, I and T (an all-zero row has no data); the responses are visual,
+// cyan, magenta, yellow. A row sums to about 100,000.
+enum { DEN_WEIGHT_STATUSES = 4, DEN_WEIGHT_RESPONSES = 4 };
+extern const int32_t den_weight[DEN_WEIGHT_STATUSES * DEN_WEIGHT_RESPONSES * NUM_WAVELENGTHS];
+
 // Hunter Lab Ka and Kb per illuminant/observer pair.
 extern const float s_HunterKa[eILLUM_OBS_NumOf];
 extern const float s_HunterKb[eILLUM_OBS_NumOf];

@@ -262,11 +262,33 @@ private slots:
         const QString root = MARIGOLD_SOURCE_DIR;
         const std::string tables = readFile(root + "/GUIApplication/SharedSystem/WeightTables.inc");
         const std::string gamma = readFile(root + "/GUIApplication/Utils/ColorMathGamma.cpp");
-        QVERIFY(!tables.empty() && !gamma.empty());
+        const std::string density = readFile(root + "/GUIApplication/Utils/ColorMathDensityWeights.cpp");
+        QVERIFY(!tables.empty() && !gamma.empty() && !density.empty());
         QVERIFY2(WeightGen::weightTablesSource(kData) == tables,
                  "WeightTables.inc differs from the generator's output: build regenerate_weighttables");
         QVERIFY2(WeightGen::gammaSource() == gamma,
                  "ColorMathGamma.cpp differs from the generator's output: build regenerate_weighttables");
+        QVERIFY2(WeightGen::densitySource(kData) == density,
+                 "ColorMathDensityWeights.cpp differs from the generator's output: build regenerate_weighttables");
+    }
+
+    void densityRowsPeakWhereTheirFiltersPass()
+    {
+        // Status A, E, T: visual, red (cyan), green (magenta), blue (yellow)
+        // filters; a swapped column would move a peak by 100 nm or more.
+        const int peaks[4] = {570, 620, 530, 440};
+        for (int status : {0, 1, 3}) {
+            for (int response = 0; response < 4; ++response) {
+                const int32_t* row = den_weight + status * 124 + response * 31;
+                QVERIFY(std::abs(columnSum(row) - 100000) <= 16);
+                const int top = int(std::max_element(row, row + NUM_WAVELENGTHS) - row);
+                QVERIFY2(std::abs(400 + 10 * top - peaks[response]) <= 20,
+                         qPrintable(QString("status %1 response %2 peaks at %3").arg(status).arg(response).arg(400 + 10 * top)));
+            }
+        }
+        // No public data for status I: its rows stay empty.
+        for (int i = 0; i < 4 * NUM_WAVELENGTHS; ++i)
+            QCOMPARE(den_weight[2 * 124 + i], 0);
     }
 
     void brokenDataIsRefusedWithTheFileName()

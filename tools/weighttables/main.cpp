@@ -1,6 +1,6 @@
 // Writes the colour library's generated sources: the tristimulus weight
 // tables and the display curve.
-//   weighttables <data dir> <WeightTables.inc> <ColorMathGamma.cpp>
+//   weighttables <data dir> <WeightTables.inc> <ColorMathGamma.cpp> <ColorMathDensityWeights.cpp>
 // A file is rewritten only when its contents change.
 #include "weightgen.h"
 
@@ -34,14 +34,17 @@ bool writeIfChanged(const std::string& path, const std::string& text)
 
 int main(int argc, char** argv)
 {
-    if (argc != 4) {
-        std::cerr << "usage: weighttables <data dir> <WeightTables.inc> <ColorMathGamma.cpp>\n";
+    if (argc != 5) {
+        std::cerr << "usage: weighttables <data dir> <WeightTables.inc> <ColorMathGamma.cpp> <ColorMathDensityWeights.cpp>\n";
         return 2;
     }
     try {
         const std::string tables = WeightGen::weightTablesSource(argv[1]);
         const std::string gamma = WeightGen::gammaSource();
-        return writeIfChanged(argv[2], tables) && writeIfChanged(argv[3], gamma) ? 0 : 1;
+        const std::string density = WeightGen::densitySource(argv[1]);
+        return writeIfChanged(argv[2], tables) && writeIfChanged(argv[3], gamma) && writeIfChanged(argv[4], density)
+                   ? 0
+                   : 1;
     } catch (const std::exception& e) {
         std::cerr << "weighttables: " << e.what() << "\n";
         return 1;

@@ -106,9 +106,16 @@ bool isWrappedXRow(int set, int pair);
 int wrap16(long long thousandths);
 long long unwrapX(long long stored);
 
+// Status density weights, laid out as den_weight: status (A, E, I, T) x
+// response (visual, cyan, magenta, yellow) x 31 wavelengths, each row the
+// ISO 5-3 spectral product at 400-700 nm made linear and scaled to sum to
+// 100,000. Status I has no public data: its rows are left 0.
+std::vector<long long> densityWeights(const std::string& dataDir);
+
 // The generated sources, byte for byte as committed.
 std::string weightTablesSource(const std::string& dataDir);
 std::string gammaSource();
+std::string densitySource(const std::string& dataDir);
 
 // The display curve: 1000 bytes through the sampled points, by a monotone
 // cubic (Fritsch-Carlson).
