@@ -149,7 +149,6 @@ bool xyzToRGB(const XYZCOORD* xyz, COLOR_REF* pcr)
     };
     *pcr = COLOR_REF(FGAMMA[gammaIndex(linear[0])]) + COLOR_REF(FGAMMA[gammaIndex(linear[1])]) * 256u
            + COLOR_REF(FGAMMA[gammaIndex(linear[2])]) * 65536u;
-
     return true;
 }
 
