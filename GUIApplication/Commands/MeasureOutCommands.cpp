@@ -138,6 +138,25 @@ void readImageChannels(CmdData& rx, Sample& sample)
     }
 }
 
+struct Triple {
+    double first;
+    double second;
+    double third;
+};
+
+// The body of a coordinate channel: two words the GUI has no use for, then
+// three values.
+Triple nextArgTriple(CmdData& rx)
+{
+    rx.nextArg_si32();
+    rx.nextArg_si32();
+    Triple v;
+    v.first = rx.nextArg_f32();
+    v.second = rx.nextArg_f32();
+    v.third = rx.nextArg_f32();
+    return v;
+}
+
 void readCurves(CmdData& rx, Sample& sample)
 {
     const int curves = rx.nextArg_si32();
@@ -159,20 +178,18 @@ void readCurves(CmdData& rx, Sample& sample)
                 }
                 sample.setReflectances(angle, refl);
             } else if (type == CHANNEL_LAB) {
-                rx.nextArg_si32();
-                rx.nextArg_si32();
+                const Triple v = nextArgTriple(rx);
                 LAB_T lab;
-                lab.l = rx.nextArg_f32();
-                lab.a = rx.nextArg_f32();
-                lab.b = rx.nextArg_f32();
+                lab.l = v.first;
+                lab.a = v.second;
+                lab.b = v.third;
                 sample.setLab(angle, lab);
             } else if (type == CHANNEL_LCH) {
-                rx.nextArg_si32();
-                rx.nextArg_si32();
+                const Triple v = nextArgTriple(rx);
                 LCH_T lch;
-                lch.l = rx.nextArg_f32();
-                lch.c = rx.nextArg_f32();
-                lch.h = rx.nextArg_f32();
+                lch.l = v.first;
+                lch.c = v.second;
+                lch.h = v.third;
                 sample.setLch(angle, lch);
             }
         }

@@ -329,21 +329,29 @@ void Job::setJobTagsFromServer(const TagItemList& list)
         m_DisplayName = m_Name;
 }
 
+bool Job::takeNonTagItem(const TAG_ITEM_T& item)
+{
+    switch (classify(item)) {
+    case DisplayNameItem:
+        m_DisplayName = item.tagText;
+        return true;
+    case CompanionItem:
+        // Read together with the tag they belong to.
+        return true;
+    case TagItem:
+        break;
+    }
+    return false;
+}
+
 void Job::setTagsFromEditableList(const TagItemList& items)
 {
     // The entry carries over from one matched item to the next, so an entry
     // without companions keeps the id and display name of the one before.
     TAG_ENTRY_DATA_T working;
     for (const TAG_ITEM_T& item : items) {
-        switch (classify(item)) {
-        case DisplayNameItem:
-            m_DisplayName = item.tagText;
+        if (takeNonTagItem(item))
             continue;
-        case CompanionItem:
-            continue;
-        case TagItem:
-            break;
-        }
         for (int state = 0; state < NUM_TAG_STATES; ++state) {
             if (!sameName(item.tagID, tagStateNameDefaultLanguage(state)))
                 continue;
@@ -361,15 +369,8 @@ void Job::setTagsFromOutsideList(const TagItemList& items)
     // such tags wait as spares for the free slots.
     QVector<TAG_ENTRY_DATA_T> spares;
     for (const TAG_ITEM_T& item : items) {
-        switch (classify(item)) {
-        case DisplayNameItem:
-            m_DisplayName = item.tagText;
+        if (takeNonTagItem(item))
             continue;
-        case CompanionItem:
-            continue;
-        case TagItem:
-            break;
-        }
         for (int state = 0; state < NUM_TAG_STATES; ++state) {
             TAG_ENTRY_DATA_T entry;
             entry.filterName = item.tagID;

@@ -118,6 +118,9 @@ public:
     bool operator!=(const Job& other) const { return !(*this == other); }
 
 private:
+    // Display-name items set the display name; they and the companions are
+    // no tags of their own.
+    bool takeNonTagItem(const TAG_ITEM_T& item);
     void setTagsFromEditableList(const TagItemList& items);
     void setTagsFromOutsideList(const TagItemList& items);
 
