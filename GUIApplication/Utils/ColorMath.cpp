@@ -118,7 +118,7 @@ inline int32_t gammaIndex(double linear)
 // The screen path (spectrum, XYZ, RGB) runs at every repaint of a colour
 // patch; these bodies are called directly, not through the exported
 // symbols, so that the compiler can inline them.
-bool reflToXYZ(const double* refls, int illumobsnr, XYZCOORD* pXYZ)
+inline bool reflToXYZ(const double* refls, int illumobsnr, XYZCOORD* pXYZ)
 {
     if (!refls || !pXYZ || !validPair(illumobsnr))
         return false;
@@ -137,7 +137,7 @@ bool reflToXYZ(const double* refls, int illumobsnr, XYZCOORD* pXYZ)
     return true;
 }
 
-bool xyzToRGB(const XYZCOORD* xyz, COLOR_REF* pcr)
+inline bool xyzToRGB(const XYZCOORD* xyz, COLOR_REF* pcr)
 {
     if (!xyz || !pcr)
         return false;
