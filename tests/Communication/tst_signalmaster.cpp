@@ -1,7 +1,6 @@
 // The signal hub: signals with arguments reach a receiver on another thread
-// queued, with their values intact.
+// queued, with their values intact, without any registration by the caller.
 
-#include "AppShell.h"
 #include "GUIAPI/API_SignalMaster.h"
 
 #include <QSignalSpy>
@@ -33,6 +32,7 @@ public slots:
     void onImage(const QByteArray& b) { note(QString("image %1").arg(b.size())); }
     void onIssue(int i) { note(QString("issue %1").arg(i)); }
     void onJobDelete(unsigned int i) { note(QString("delete %1").arg(i)); }
+    void onSample(const Sample& s) { note(QString("sample %1").arg(s.getFileID())); }
 
 private:
     void note(const QString& s)
@@ -53,11 +53,6 @@ class TestSignalMaster : public QObject
     Q_OBJECT
 
 private slots:
-    void initTestCase()
-    {
-        AppShell::registerMetaTypes();
-    }
-
     void isOneLazySingleton()
     {
         QVERIFY(API_SignalMaster::instance() != nullptr);
@@ -79,6 +74,7 @@ private slots:
         connect(hub, &API_SignalMaster::TargetingImageUpdated, &receiver, &Receiver::onImage);
         connect(hub, &API_SignalMaster::MeasurementIssue, &receiver, &Receiver::onIssue);
         connect(hub, &API_SignalMaster::JobDelete, &receiver, &Receiver::onJobDelete);
+        connect(hub, &API_SignalMaster::AddedSample, &receiver, &Receiver::onSample);
 
         SystemStatus status;
         status.setPercentComplete(64);
@@ -96,9 +92,12 @@ private slots:
         hub->emitTargetingImageUpdated(QByteArray(503208, 'x'));
         hub->emitMeasurementIssue(-2);
         hub->emitJobDelete(65535);
+        Sample sample;
+        sample.setFileID(7);
+        hub->emitAddedSample(sample);
 
         const QStringList expected{"status 64", "test White tile 3", "test White tile 0", "pressure 1",
-                                   "orientation -9", "image 503208", "issue -2", "delete 65535"};
+                                   "orientation -9", "image 503208", "issue -2", "delete 65535", "sample 7"};
         QTRY_COMPARE_WITH_TIMEOUT(receiver.snapshot(), expected, 3000);
         QCOMPARE(receiver.seenOn(), &thread);
         thread.quit();
