@@ -6,6 +6,7 @@
 #include "Screens/ErrorPopup.h"
 #include "Screens/NotificationPopup.h"
 #include "Screens/OverridePopup.h"
+#include "Screens/PowerDownPopup.h"
 #include "Screens/TerminateJobPopup.h"
 #include "Screens/UndoPopup.h"
 #include "SharedSystem/Platform.h"
@@ -141,6 +142,16 @@ private slots:
         QCOMPARE(closed.count(), 1);
         settleSounds();
         QCOMPARE(clicks(), 0);
+    }
+
+    void powerDownPopupOffersItsThreeChoices()
+    {
+        PowerDownPopup popup;
+        QCOMPARE(buttonText(&popup, "BtnPowerOff"), QString("Power Off"));
+        QCOMPARE(buttonText(&popup, "BtnReboot"), QString("Reboot"));
+        QSignalSpy closed(&popup, &PopupPanel::closePopup);
+        press(&popup, "BtnCancel");
+        QCOMPARE(closed.count(), 1);
     }
 
     void undoPopupRaisesUndoAndBack()
