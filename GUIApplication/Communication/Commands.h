@@ -8,9 +8,14 @@
 
 #include "Communication/CmdData.h"
 
+#include <QMutex>
+#include <QMutexLocker>
 #include <QObject>
 
 class TcpClient;
+
+// The time-out of a command unless its table entry says otherwise.
+const int DEFAULT_COMMAND_TIMEOUT_MS = 4000;
 
 class Commands : public QObject
 {
@@ -38,5 +43,32 @@ private:
     TcpClient* m_tcp;
     short m_transID;
 };
+
+// The shape of every CmdOut_ function: the family's lock, a new request
+// carrying the code and the arguments written by append, one transaction, the
+// reply read by read straight into the caller's outputs. read returns the
+// function's result (usually STATUS_OK). A status thrown on the way comes back
+// as the result, so a CmdOut_ function never throws, and outputs may be half
+// filled on a failure.
+template <typename Append, typename Read>
+STATUS_T runCommand(QRecursiveMutex& familyMutex, long code, bool validate, int timeout,
+                    Append append, Read read)
+{
+    QMutexLocker lock(&familyMutex);
+    try {
+        CmdData cmdTx;
+        CmdData cmdRx;
+        cmdTx.setCommandCode(code);
+        append(cmdTx);
+        cmdRx = Commands::instance()->sendAndReceive(cmdTx, validate, timeout);
+        return read(cmdRx);
+    } catch (unsigned int status) {
+        return status;
+    }
+}
+
+// For commands without arguments or without anything to read.
+inline void noArguments(CmdData&) {}
+inline STATUS_T nothingRead(CmdData&) { return STATUS_OK; }
 
 #endif // COMMANDS_H

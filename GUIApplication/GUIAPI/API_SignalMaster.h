@@ -12,10 +12,8 @@
 #include <QByteArray>
 #include <QObject>
 
-#if __has_include("SharedSystem/Sample.h")
 #include "SharedSystem/Sample.h"
 #define MARIGOLD_HAVE_SAMPLE 1
-#endif
 
 class API_SignalMaster : public QObject
 {

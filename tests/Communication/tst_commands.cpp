@@ -52,16 +52,10 @@ private:
     // that their watchdogs don't talk into the test.
     void freshLink(bool waitForConnection = true)
     {
-        TcpClient* old = Commands::instance()->tcpClient();
         m_peer.reset(new ScriptedPeer);
         QVERIFY(m_peer->listen());
-        setIpAddress("127.0.0.1");
-        setIpPort(m_peer->port());
-        QSignalSpy reconnected(API_SignalMaster::instance(), &API_SignalMaster::TcpReconnected);
-        Commands::Init();
-        delete old;
-        if (waitForConnection)
-            QVERIFY(reconnected.wait(3000));
+        const bool connected = m_peer->attachCommands(waitForConnection ? 3000 : 1);
+        QVERIFY(connected || !waitForConnection);
     }
 
     void failQuietly(int calls)
@@ -100,9 +94,7 @@ private slots:
     void transactionIdsStartAt0AndWrapIn16Bits()
     {
         freshLink();
-        m_peer->setResponder([](const QByteArray& f) {
-            return ScriptedPeer::Reply{{ScriptedPeer::replyTo(f, 0)}, 0};
-        });
+        m_peer->answerAll(0);
         CmdData first = command(0x10000000);
         Commands::instance()->sendAndReceive(first, true, 4000);
         QCOMPARE(transactionOf(m_peer->receivedFrames().value(0)), short(0));
@@ -132,9 +124,7 @@ private slots:
 
         // Init starts the numbers again.
         freshLink();
-        m_peer->setResponder([](const QByteArray& f) {
-            return ScriptedPeer::Reply{{ScriptedPeer::replyTo(f, 0)}, 0};
-        });
+        m_peer->answerAll(0);
         CmdData e = command(1);
         Commands::instance()->sendAndReceive(e, false, 4000);
         QCOMPARE(e.getTransactionID(), short(0));
@@ -160,9 +150,7 @@ private slots:
     void serverStatusOnAValidatedCommandBecomes2()
     {
         freshLink();
-        m_peer->setResponder([](const QByteArray& f) {
-            return ScriptedPeer::Reply{{ScriptedPeer::replyTo(f, 9)}, 0};
-        });
+        m_peer->answerAll(9);
         CmdData cmd = command(0x40010030);
         QTest::ignoreMessage(QtDebugMsg, "Invalid status in command 0x40010030 9");
         QTest::ignoreMessage(QtDebugMsg, "Error 0x2 in command 0x40010030");

@@ -1,6 +1,12 @@
 #include "support/ScriptedPeer.h"
 
 #include "Communication/CmdData.h"
+#include "Communication/Commands.h"
+#include "Communication/TcpClient.h"
+#include "GUIAPI/API_SignalMaster.h"
+#include "SharedSystem/Instrument.h"
+
+#include <QSignalSpy>
 
 #include <chrono>
 #include <map>
@@ -150,6 +156,26 @@ bool ScriptedPeer::waitForIdle(int timeoutMs) const
     std::unique_lock<std::mutex> lock(m_mutex);
     return m_changed.wait_for(lock, std::chrono::milliseconds(timeoutMs), [&] {
         return m_unanswered.isEmpty() && m_unsolicited.isEmpty() && !m_busyWriting;
+    });
+}
+
+bool ScriptedPeer::attachCommands(int timeoutMs)
+{
+    TcpClient* old = Commands::instance()->tcpClient();
+    setIpAddress("127.0.0.1");
+    setIpPort(m_port);
+    QSignalSpy reconnected(API_SignalMaster::instance(), &API_SignalMaster::TcpReconnected);
+    Commands::Init();
+    delete old;
+    return reconnected.wait(timeoutMs);
+}
+
+void ScriptedPeer::answerAll(quint32 status, const QByteArray& payload)
+{
+    setResponder([status, payload](const QByteArray& frame) {
+        Reply reply;
+        reply.chunks << replyTo(frame, status, payload);
+        return reply;
     });
 }
 

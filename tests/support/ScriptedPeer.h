@@ -64,6 +64,13 @@ public:
     int connectionCount() const { return m_accepted.load(); }
     bool hasConnection() const;
 
+    // Points the command front at this peer: Commands::Init() with this
+    // port, the earlier link client deleted so that its watchdog stays quiet,
+    // and waits for the connection. Needs an event loop on the calling thread.
+    bool attachCommands(int timeoutMs = 3000);
+    // Answers every frame with the given status and payload.
+    void answerAll(quint32 status, const QByteArray& payload = QByteArray());
+
     // Wait until so many frames or connections have been seen.
     bool waitForFrames(int count, int timeoutMs = 5000) const;
     bool waitForConnections(int count, int timeoutMs = 5000) const;

@@ -1,0 +1,101 @@
+#include "Widgets/KLabel.h"
+
+#include <QFontMetrics>
+#include <QResizeEvent>
+
+#include <algorithm>
+
+namespace {
+
+// Word wrap and centred both ways.
+const int kWrapFlags = Qt::TextWordWrap | Qt::AlignHCenter | Qt::AlignVCenter;
+
+int sizeOf(const QFont& font)
+{
+    return font.pointSize() > 0 ? font.pointSize() : font.pixelSize();
+}
+
+void setSizeOf(QFont& font, qreal size)
+{
+    if (font.pointSize() > 0)
+        font.setPointSizeF(size);
+    else
+        font.setPixelSize(qMax(1, int(size)));
+}
+
+} // namespace
+
+KLabel::KLabel(QWidget* parent)
+    : QLabel(parent)
+    , m_defaultFont(font())
+{
+}
+
+KLabel::KLabel(const QString& text, QWidget* parent)
+    : QLabel(parent)
+    , m_defaultFont(font())
+{
+    setText(text);
+}
+
+void KLabel::setAutoSize(bool autoSize)
+{
+    m_autoSize = autoSize;
+    setText(m_defaultText);
+}
+
+void KLabel::setMaxTextLength(int length)
+{
+    m_maxTextLength = length < 0 ? -1 : length;
+    setText(m_defaultText);
+}
+
+void KLabel::setText(const QString& text)
+{
+    m_defaultText = text;
+    QLabel::setText(m_maxTextLength < 0 ? text : text.left(m_maxTextLength));
+    QLabel::setFont(m_autoSize ? fittedFont(text) : m_defaultFont);
+}
+
+void KLabel::setFont(QFont font)
+{
+    m_defaultFont = font;
+    QLabel::setFont(font);
+}
+
+void KLabel::resizeEvent(QResizeEvent* event)
+{
+    QLabel::resizeEvent(event);
+    // Forms often size a label after giving it its text.
+    if (m_autoSize && event->size() != event->oldSize())
+        QLabel::setFont(fittedFont(m_defaultText));
+}
+
+QFont KLabel::fittedFont(const QString& text) const
+{
+    QFont f = m_defaultFont;
+    if (wordWrap()) {
+        // Always the full text, also when a maximum length cuts what shows.
+        const QRect box(0, 0, width(), height());
+        while (sizeOf(f) > 1) {
+            const QRect needed = QFontMetrics(f).boundingRect(box, kWrapFlags, text);
+            if (needed.width() <= width() && needed.height() <= height())
+                break;
+            setSizeOf(f, sizeOf(f) - 1);
+        }
+        return f;
+    }
+
+    const QFontMetrics metrics(f);
+    const int textWidth = metrics.horizontalAdvance(text);
+    const int textHeight = metrics.height();
+    const float widthRatio = textWidth > 0 ? float(width()) / float(textWidth) : 1.0f;
+    const float heightRatio = textHeight > 0 ? float(height()) / float(textHeight) : 1.0f;
+    const float ratio = std::min(widthRatio, heightRatio);
+    if (ratio < 1.0f) {
+        const qreal base = f.pointSize() > 0 ? f.pointSizeF() : qreal(f.pixelSize());
+        // A box of zero size must still leave a usable font.
+        setSizeOf(f, std::max<qreal>(1.0, base * ratio));
+    }
+    return f;
+}

@@ -1,0 +1,146 @@
+// The signal hub: each emit function raises its own signal, and the signals
+// with arguments cross threads queued.
+
+#include "AppShell.h"
+#include "GUIAPI/API_SignalMaster.h"
+
+#include <QSignalSpy>
+#include <QThread>
+#include <QtTest>
+
+namespace {
+
+using Emitter = void (API_SignalMaster::*)();
+using Signal = void (API_SignalMaster::*)();
+
+struct Pair {
+    const char* name;
+    Emitter emitter;
+    Signal signal;
+};
+
+#define PAIR(n) Pair{#n, &API_SignalMaster::emit##n, &API_SignalMaster::n}
+
+const Pair kPlainSignals[] = {
+    PAIR(TcpReconnected), PAIR(TcpDisconnected), PAIR(SadPuppy), PAIR(TriggerMeasurement),
+    PAIR(TriggerResumeIdle), PAIR(TriggerCalibration), PAIR(TriggerReferenceCheck), PAIR(TriggerTargetingStart),
+    PAIR(TriggerTargetingStop), PAIR(TriggerWifiScan), PAIR(MeasurementStarted), PAIR(MeasurementComplete),
+    PAIR(CalculationComplete), PAIR(CalibrationComplete), PAIR(ReferenceCheckComplete), PAIR(SelfTestWhiteComplete),
+    PAIR(SelfTestReferenceComplete), PAIR(SelfTestOtherComplete), PAIR(LockStarted), PAIR(LockFinished),
+    PAIR(SyncScreen), PAIR(GoHome), PAIR(GoToWhiteCalibration), PAIR(GoToRefCheck), PAIR(GoToLabMode),
+    PAIR(DisplayCalibrationPopup), PAIR(TemperatureWarning), PAIR(JobInfoUpdated), PAIR(JobDeleteAll),
+    PAIR(JobDeleteCurrent), PAIR(JobDeleteAllCompleted), PAIR(JobDeleteAllSamples), PAIR(SampleCurrentDelete),
+    PAIR(JobUpdate), PAIR(JobCurrentUpdate), PAIR(JobCurrentDelete), PAIR(SampleUpdate), PAIR(SampleCurrentUpdate),
+};
+
+// Lives on another thread and records what reached it.
+class Receiver : public QObject
+{
+    Q_OBJECT
+public:
+    QStringList snapshot()
+    {
+        QMutexLocker lock(&m_mutex);
+        return m_got;
+    }
+    QThread* seenOn()
+    {
+        QMutexLocker lock(&m_mutex);
+        return m_seenOn;
+    }
+public slots:
+    void onStatus(const SystemStatus& s) { note(QString("status %1").arg(s.getPercentComplete())); }
+    void onTest(const TEST& t, unsigned int r) { note(QString("test %1 %2").arg(t.description).arg(r)); }
+    void onPressure(const PRESSURE_SWITCH_T& p) { note(QString("pressure %1").arg(p.Switch2)); }
+    void onOrientation(const ACCELEROMETER_ORIENTATION_T& o) { note(QString("orientation %1").arg(o.OrientationY)); }
+    void onImage(const QByteArray& b) { note(QString("image %1").arg(b.size())); }
+    void onIssue(int i) { note(QString("issue %1").arg(i)); }
+    void onJobDelete(unsigned int i) { note(QString("delete %1").arg(i)); }
+
+private:
+    void note(const QString& s)
+    {
+        QMutexLocker lock(&m_mutex);
+        m_seenOn = QThread::currentThread();
+        m_got << s;
+    }
+    QMutex m_mutex;
+    QStringList m_got;
+    QThread* m_seenOn = nullptr;
+};
+
+} // namespace
+
+class TestSignalMaster : public QObject
+{
+    Q_OBJECT
+
+private slots:
+    void initTestCase()
+    {
+        AppShell::registerMetaTypes();
+    }
+
+    void isOneLazySingleton()
+    {
+        QVERIFY(API_SignalMaster::instance() != nullptr);
+        QCOMPARE(API_SignalMaster::instance(), API_SignalMaster::instance());
+    }
+
+    void eachEmitFunctionRaisesItsOwnSignal()
+    {
+        API_SignalMaster* hub = API_SignalMaster::instance();
+        for (const Pair& p : kPlainSignals) {
+            QSignalSpy spy(hub, p.signal);
+            QSignalSpy other(hub, &API_SignalMaster::MeasurementIssue);
+            (hub->*p.emitter)();
+            QVERIFY2(spy.count() == 1, p.name);
+            QCOMPARE(other.count(), 0);
+        }
+    }
+
+    void argumentsCrossThreadsQueued()
+    {
+        QThread thread;
+        Receiver receiver;
+        receiver.moveToThread(&thread);
+        thread.start();
+        API_SignalMaster* hub = API_SignalMaster::instance();
+        connect(hub, &API_SignalMaster::StatusUpdated, &receiver, &Receiver::onStatus);
+        connect(hub, &API_SignalMaster::SelfTestTestComplete, &receiver, &Receiver::onTest);
+        connect(hub, &API_SignalMaster::TriggerSelfTest, &receiver, [&receiver](const TEST& t) { receiver.onTest(t, 0); });
+        connect(hub, &API_SignalMaster::PressureSwitchesUpdated, &receiver, &Receiver::onPressure);
+        connect(hub, &API_SignalMaster::OrientationUpdated, &receiver, &Receiver::onOrientation);
+        connect(hub, &API_SignalMaster::TargetingImageUpdated, &receiver, &Receiver::onImage);
+        connect(hub, &API_SignalMaster::MeasurementIssue, &receiver, &Receiver::onIssue);
+        connect(hub, &API_SignalMaster::JobDelete, &receiver, &Receiver::onJobDelete);
+
+        SystemStatus status;
+        status.setPercentComplete(64);
+        hub->emitStatusUpdated(status);
+        TEST test;
+        test.description = "White tile";
+        hub->emitSelfTestTestComplete(test, 3);
+        hub->emitTriggerSelfTest(test);
+        PRESSURE_SWITCH_T pressure;
+        pressure.Switch2 = 1;
+        hub->emitPressureSwitchesUpdated(pressure);
+        ACCELEROMETER_ORIENTATION_T orientation;
+        orientation.OrientationY = -9;
+        hub->emitOrientationUpdated(orientation);
+        hub->emitTargetingImageUpdated(QByteArray(503208, 'x'));
+        hub->emitMeasurementIssue(-2);
+        hub->emitJobDelete(65535);
+
+        const QStringList expected{"status 64", "test White tile 3", "test White tile 0", "pressure 1",
+                                   "orientation -9", "image 503208", "issue -2", "delete 65535"};
+        QTRY_COMPARE_WITH_TIMEOUT(receiver.snapshot(), expected, 3000);
+        QCOMPARE(receiver.seenOn(), &thread);
+        thread.quit();
+        thread.wait();
+        disconnect(hub, nullptr, &receiver, nullptr);
+    }
+};
+
+QTEST_GUILESS_MAIN(TestSignalMaster)
+#include "tst_signalmaster.moc"
