@@ -1,6 +1,8 @@
 #include "AppShell.h"
 
+#include "Communication/CmdData.h"
 #include "SharedSystem/Instrument.h"
+#include "SharedSystem/Sample.h"
 #include "SharedSystem/InstrumentTypes.h"
 #include "SharedSystem/SystemStatus.h"
 
@@ -53,8 +55,8 @@ void writeVersionFile(const QString& directory)
 
 void registerMetaTypes()
 {
-    // CommandData and ResponseData register themselves with the link layer
-    // (they live there); the order of the others follows start-up.
+    qRegisterMetaType<CommandData>("CommandData");
+    qRegisterMetaType<ResponseData>("ResponseData");
     qRegisterMetaType<SYSTEM_STATE_T>("SYSTEM_STATE_T");
     qRegisterMetaType<BATTERY_STATUS_T>("BATTERY_STATUS_T");
     qRegisterMetaType<LANGUAGE_T>("LANGUAGE_T");
@@ -63,6 +65,7 @@ void registerMetaTypes()
     qRegisterMetaType<ACCELEROMETER_ORIENTATION_T>("ACCELEROMETER_ORIENTATION_T");
     qRegisterMetaType<SystemStatus>("SystemStatus");
     qRegisterMetaType<SYSTEM_STATE_T>("SYSTEM_STATE_T");
+    qRegisterMetaType<Sample>("Sample");
     qRegisterMetaType<SOUNDS>("SOUNDS");
     qRegisterMetaType<TEST>("TEST");
     qRegisterMetaType<NETWORK_DESCRIPTION_T>("NETWORK_DESCRIPTION_T");
