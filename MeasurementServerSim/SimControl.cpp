@@ -259,10 +259,10 @@ QString Control::dispatch(const QString& command, const QStringList& a)
     }
     if (command == QLatin1String("busy")) {
         bool on = false;
-        if (n == 1 && onOff(a[0], &on))
-            ins.setBusy(on ? -1 : 0);
-        else if (n == 1 && toInt(a[0], &v) && v >= 0)
+        if (n == 1 && toInt(a[0], &v) && v >= 0)
             ins.setBusy(v * 1000);
+        else if (n == 1 && onOff(a[0], &on))
+            ins.setBusy(on ? -1 : 0);
         else
             return err(QStringLiteral("usage: busy SECONDS|on|off"));
         return ok();

@@ -760,9 +760,10 @@ QString Instrument::panelForJob(const QString& jobName)
     return spec;
 }
 
-Sample Instrument::makeReading(const QString& panelSpec)
+Sample Instrument::makeReading(const QString& panelSpec, int outlierSign)
 {
     Spectra::ReadingNoise noise;
+    noise.outlierSign = outlierSign;
     std::uniform_real_distribution<double> u01(0.0, 1.0);
     std::normal_distribution<double> n01(0.0, 1.0);
     noise.outlier = m_forceOutlier >= 0 ? m_forceOutlier == 1 : u01(m_rng) < m_outlierRate;
@@ -847,7 +848,8 @@ void Instrument::finishOperation()
         const Sample s = makeReading(panelForJob(op.job));
         m_op = Operation();
         m_jobs.commitMeasurement(op.job, s);
-        m_lastReading = s;
+        const Job* job = m_jobs.find(op.job);
+        m_lastReading = job && !job->samples.isEmpty() ? job->samples.last() : s;
         m_hasLastReading = true;
         checkStorage();
         break;
@@ -1176,8 +1178,10 @@ void Instrument::seedDemo()
         const QDateTime base = QDateTime::currentDateTime().addDays(-dj.daysAgo).addSecs(-3600);
         for (int r = 0; r < dj.readings; ++r) {
             m_op.switchesAtStart.Switch1 = m_op.switchesAtStart.Switch2 = m_op.switchesAtStart.Switch3 = 1;
-            m_forceOutlier = r < dj.outliers ? 1 : 0;
-            Sample s = makeReading(panel);
+            // Clean readings first, then strays that scatter both ways.
+            const bool stray = r >= dj.readings - dj.outliers;
+            m_forceOutlier = stray ? 1 : 0;
+            Sample s = makeReading(panel, (r % 2) ? -1 : 1);
             s.time = base.addSecs(r * 40);
             s.calibrationStatus = CALIBRATION_STATUS_GOOD;
             m_jobs.commitMeasurement(d.name, s);

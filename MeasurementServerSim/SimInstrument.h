@@ -209,7 +209,7 @@ private:
     void updateTick();
     int scaled(int ms) const;
     bool allDown() const { return switchesDown() == 3; }
-    Sample makeReading(const QString& panelSpec);
+    Sample makeReading(const QString& panelSpec, int outlierSign = 0);
     QString panelForJob(const QString& jobName);
     QString panelForView() const;
     void checkStorage();

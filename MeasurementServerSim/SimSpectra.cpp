@@ -204,7 +204,8 @@ QVector<float> measure(const QString& spec, int numAngles, const ReadingNoise& n
     if (noise.outlier) {
         // A rocked instrument: the whole reading is off by some per cent, more
         // at one end of the angle range than at the other.
-        outlierGain = 1.0 + (u01(rng) < 0.5 ? -1.0 : 1.0) * (0.06 + 0.05 * u01(rng));
+        const double sign = noise.outlierSign != 0 ? (noise.outlierSign > 0 ? 1.0 : -1.0) : (u01(rng) < 0.5 ? -1.0 : 1.0);
+        outlierGain = 1.0 + sign * (0.06 + 0.05 * u01(rng));
         outlierSlope = (u01(rng) - 0.5) * 0.06;
     }
     double r[NUM_WAVELENGTHS];

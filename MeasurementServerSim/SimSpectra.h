@@ -53,6 +53,7 @@ struct ReadingNoise {
     double gainSigma = 0.002;      // per angle, relative
     double additiveSigma = 0.0007; // per wavelength, absolute
     bool outlier = false;          // a rocked or dirty contact
+    int outlierSign = 0;           // +1 lighter, -1 darker, 0 either
 };
 
 // One reading of a panel at numAngles geometries: numAngles x 31 values.
