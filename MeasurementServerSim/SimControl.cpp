@@ -45,6 +45,7 @@ const char* const kHelp[] = {
     "memory MAX_JOBS MAX_MEASUREMENTS",
     "targeting-timeout SECONDS     leave targeting after so long (0: never)",
     "jobs                          list the jobs",
+    "bulk JOBS READINGS            add so many complete jobs of readings (load tests)",
     "job-state NAME STATE          put a job into a state (e.g. 2008)",
     "refuse CODE STATUS [COUNT] | refuse CODE off | refuse off",
     "delay MS                      hold every reply back",
@@ -445,6 +446,13 @@ QString Control::dispatch(const QString& command, const QStringList& a)
                          .arg(j.hasAverage ? QStringLiteral(" + average") : QString());
         lines << ok(QString::number(ins.jobs().jobs().size()));
         return lines.join(QLatin1Char('\n'));
+    }
+    if (command == QLatin1String("bulk")) {
+        int readings = 0;
+        if (n != 2 || !toInt(a[0], &v) || !toInt(a[1], &readings) || v < 1 || readings < 0)
+            return err(QStringLiteral("usage: bulk JOBS READINGS"));
+        const int made = ins.addBulkJobs(v, readings);
+        return made == v ? ok(QString::number(made)) : err(QStringLiteral("only %1 made: memory full").arg(made));
     }
     if (command == QLatin1String("job-state")) {
         if (n != 2 || !toInt(a[1], &v) || !ins.jobs().find(a[0]))

@@ -1129,6 +1129,39 @@ void Instrument::setPanel(const QString& finishKey)
     m_panel = finishKey.isEmpty() ? QString() : Spectra::finish(finishKey).key;
 }
 
+int Instrument::addBulkJobs(int jobs, int readingsPerJob)
+{
+    jobs = std::max(0, jobs);
+    readingsPerJob = std::max(0, std::min(readingsPerJob, 255));
+    int made = 0;
+    m_store.begin();
+    const QStringList keys = Spectra::finishKeys();
+    for (int i = 1; made < jobs && i < 100000; ++i) {
+        JobBook::Description d;
+        d.name = QStringLiteral("Bulk %1").arg(i);
+        if (m_jobs.find(d.name))
+            continue;
+        d.modeText = QStringLiteral("NONE");
+        d.size = readingsPerJob;
+        d.tags = {{QStringLiteral("DisplayName"), QStringLiteral("Bulk panel %1").arg(i)}};
+        if (addJob(d, nullptr) != ST_OK)
+            break;
+        const QString panel = Spectra::panelSpec(keys[i % keys.size()], quint32(i));
+        m_jobs.setFinish(d.name, panel);
+        m_op.switchesAtStart.Switch1 = m_op.switchesAtStart.Switch2 = m_op.switchesAtStart.Switch3 = 1;
+        for (int r = 0; r < readingsPerJob; ++r) {
+            m_forceOutlier = 0;
+            m_jobs.commitMeasurement(d.name, makeReading(panel));
+        }
+        ++made;
+    }
+    m_op = Operation();
+    m_forceOutlier = -1;
+    m_store.commit();
+    checkStorage();
+    return made;
+}
+
 // ---- the demo set -----------------------------------------------------------------------------
 
 void Instrument::seedDemo()

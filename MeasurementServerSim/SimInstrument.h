@@ -182,6 +182,9 @@ public:
     STATUS_T startOnlineJob(const QString& name, const QString& modeText, int size, int maxSamples, QString* created);
     void endOnlineJob();
     void setPowerUp(int ms);
+    // Fills the store with jobs of readings, for load tests: jobs "Bulk 1"
+    // and on, each complete with its readings. Returns the jobs made.
+    int addBulkJobs(int jobs, int readingsPerJob);
 
 signals:
     // The client asked to restart or switch off the instrument.

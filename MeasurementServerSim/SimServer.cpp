@@ -54,9 +54,12 @@ bool Server::start(QString* error)
         m_controlServer = new QTcpServer(this);
         connect(m_controlServer, &QTcpServer::newConnection, this, &Server::onControlConnection);
         if (!m_controlServer->listen(QHostAddress::LocalHost, quint16(m_options.controlPort))) {
-            if (error)
-                *error = QStringLiteral("control port %1: %2").arg(m_options.controlPort).arg(m_controlServer->errorString());
-            return false;
+            // The protocol is what matters; the control lines still work on stdin.
+            qWarning().noquote() << QStringLiteral("Sim: no control port %1: %2")
+                                        .arg(m_options.controlPort)
+                                        .arg(m_controlServer->errorString());
+            delete m_controlServer;
+            m_controlServer = nullptr;
         }
     }
     if (m_options.controlOnStdin) {

@@ -283,6 +283,7 @@ private slots:
         QVERIFY(sim->control(QStringLiteral("online start x smc 5 3")).startsWith(QStringLiteral("ERR")));
         QVERIFY(sim->control(QStringLiteral("panel chrome")).startsWith(QStringLiteral("ERR")));
         QVERIFY(sim->control(QStringLiteral("status")).contains(QStringLiteral("battery 9%")));
+        QCOMPARE(sim->control(QStringLiteral("bulk 2 3")), QStringLiteral("OK 2"));
         sim->call([](Server& s) {
             Instrument& ins = s.instrument();
             QCOMPARE(ins.batteryPercent(), 9);
@@ -297,6 +298,8 @@ private slots:
             QCOMPARE(ins.parameter(PARAMETER_TEXT_MESSAGE)->s, QStringLiteral("Please calibrate"));
             QCOMPARE(ins.parameter(PARAMETER_WHITE_TRANSFER_REQUEST)->i, 1);
             QCOMPARE(ins.secondsToCalibration(), 90);
+            QCOMPARE(ins.jobs().find(QStringLiteral("Bulk 2"))->samples.size(), 3);
+            QCOMPARE(ins.jobs().find(QStringLiteral("Bulk 2"))->state, JOB_COMPLETE);
             const quint32 bits = ins.takeStatus().settingsBits;
             for (quint32 bit : {BIT_ONLINE_JOB, BIT_AUTO_MEASURE, BIT_TEXT_MESSAGE, BIT_WHITE_TRANSFER})
                 QVERIFY(bits & bit);
