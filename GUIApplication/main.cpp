@@ -1,4 +1,5 @@
 #include "AppShell.h"
+#include "GUIAPI/DataManager.h"
 #include "MyApplication.h"
 
 #include <QDebug>
@@ -29,6 +30,9 @@ int main(int argc, char* argv[])
     QTextCodec::setCodecForLocale(QTextCodec::codecForName("utf8"));
 
     // 7, 8: singletons and their Init() calls join here as they are built.
+    // DataManagerTask::instance() returns once its thread runs.
+    DataManagerTask::instance();
+    DataManager::instance()->Init();
 
     // 9
     QThread::currentThread()->setPriority(QThread::HighPriority);
