@@ -1,14 +1,16 @@
 // Speed of the colour path every patch on screen takes (spectrum -> XYZ ->
 // screen RGB) and of XYZ -> L*a*b*, with littleCMS's cmsXYZ2Lab on the same
 // inputs as the outside reference for both time and values.
-// Prints nanoseconds per call, the median of repeated runs.
+// Prints nanoseconds per call, the median of repeated runs, timed on the
+// thread's CPU clock so that time spent descheduled on a busy machine is
+// not counted.
 #include "SharedSystem/WeightTables.h"
 #include "Utils/ColorMath.h"
 
 #include <lcms2.h>
 
 #include <algorithm>
-#include <chrono>
+#include <ctime>
 #include <cmath>
 #include <cstdio>
 #include <functional>
@@ -46,17 +48,24 @@ std::vector<std::vector<double>> makeSpectra()
     return out;
 }
 
+double threadCpuNs()
+{
+    timespec ts;
+    clock_gettime(CLOCK_THREAD_CPUTIME_ID, &ts);
+    return double(ts.tv_sec) * 1e9 + double(ts.tv_nsec);
+}
+
 // Median nanoseconds per call of `pass`, which makes `calls` calls.
 double timeIt(const std::function<void()>& pass, int calls)
 {
     std::vector<double> ns;
     pass(); // warm up
     for (int run = 0; run < kRuns; ++run) {
-        const auto t0 = std::chrono::steady_clock::now();
+        const double t0 = threadCpuNs();
         for (int round = 0; round < kRounds; ++round)
             pass();
-        const auto t1 = std::chrono::steady_clock::now();
-        ns.push_back(std::chrono::duration<double, std::nano>(t1 - t0).count() / (double(calls) * kRounds));
+        const double t1 = threadCpuNs();
+        ns.push_back((t1 - t0) / (double(calls) * kRounds));
     }
     std::sort(ns.begin(), ns.end());
     return ns[ns.size() / 2];

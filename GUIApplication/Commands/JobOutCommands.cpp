@@ -3,7 +3,6 @@
 #include "Communication/CmdData.h"
 #include "Communication/Commands.h"
 
-#include <QMutexLocker>
 #include <QRecursiveMutex>
 
 namespace {
@@ -18,11 +17,16 @@ constexpr long CMD_DELETE_JOB = 0x40010040;
 constexpr long CMD_EDIT_JOB = 0x40010050;
 constexpr long CMD_SET_JOB_SAVED = 0x40010070;
 constexpr long CMD_DELETE_SAMPLE = 0x41000110;
-constexpr int TIMEOUT_MS = 4000;
 
 // The smallest sample info on the wire: si32, time, three f32,
 // acceleration, ui8, pressure.
 constexpr int SAMPLE_INFO_WIRE_SIZE = 4 + 6 + 12 + 9 + 1 + 3;
+
+// An unvalidated command whose answer is its status.
+STATUS_T statusOnly(CmdData& rx)
+{
+    return rx.getStatus();
+}
 
 bool goesWide(const TAG_ITEM_T& tag)
 {
@@ -145,134 +149,80 @@ void CmdData::nextArgJobInfo(Job& job)
 
 STATUS_T CmdOut_GetJobInfos(QVector<Job>& jobs)
 {
-    QMutexLocker lock(&s_jobMutex);
-    CmdData cmdTx;
-    CmdData cmdRx;
-    try {
-        cmdTx.setCommandCode(CMD_GET_JOB_INFOS);
-        cmdRx = Commands::instance()->sendAndReceive(cmdTx, true, TIMEOUT_MS);
-        jobs.clear();
-        const int count = cmdRx.nextArg_si32();
-        for (int i = 0; i < count; ++i) {
-            Job job;
-            cmdRx.nextArgJobInfo(job);
-            jobs.append(job);
-        }
-        return STATUS_OK;
-    } catch (unsigned int status) {
-        return status;
-    }
+    return runCommand(s_jobMutex, CMD_GET_JOB_INFOS, true, DEFAULT_COMMAND_TIMEOUT_MS, noArguments,
+                      [&jobs](CmdData& rx) {
+                          jobs.clear();
+                          const int count = rx.nextArg_si32();
+                          for (int i = 0; i < count; ++i) {
+                              Job job;
+                              rx.nextArgJobInfo(job);
+                              jobs.append(job);
+                          }
+                          return STATUS_OK;
+                      });
 }
 
 STATUS_T CmdOut_GetJobInfo(const QString& fileID, Job& job)
 {
-    QMutexLocker lock(&s_jobMutex);
-    CmdData cmdTx;
-    CmdData cmdRx;
-    try {
-        cmdTx.setCommandCode(CMD_GET_JOB_INFO);
-        cmdTx.appendString(fileID);
-        cmdRx = Commands::instance()->sendAndReceive(cmdTx, true, TIMEOUT_MS);
-        cmdRx.nextArgJobInfo(job);
-        return STATUS_OK;
-    } catch (unsigned int status) {
-        return status;
-    }
+    return runCommand(s_jobMutex, CMD_GET_JOB_INFO, true, DEFAULT_COMMAND_TIMEOUT_MS,
+                      [&fileID](CmdData& tx) { tx.appendString(fileID); },
+                      [&job](CmdData& rx) {
+                          rx.nextArgJobInfo(job);
+                          return STATUS_OK;
+                      });
 }
 
 STATUS_T CmdOut_GetJobInfoWeb(const QString& fileID, unsigned long& a, unsigned long& b)
 {
-    QMutexLocker lock(&s_jobMutex);
-    CmdData cmdTx;
-    CmdData cmdRx;
-    try {
-        cmdTx.setCommandCode(CMD_GET_JOB_INFO_WEB);
-        cmdTx.appendString(fileID);
-        cmdRx = Commands::instance()->sendAndReceive(cmdTx, true, TIMEOUT_MS);
-        a = cmdRx.nextArg_ui32();
-        b = cmdRx.nextArg_ui32();
-        return STATUS_OK;
-    } catch (unsigned int status) {
-        return status;
-    }
+    return runCommand(s_jobMutex, CMD_GET_JOB_INFO_WEB, true, DEFAULT_COMMAND_TIMEOUT_MS,
+                      [&fileID](CmdData& tx) { tx.appendString(fileID); },
+                      [&a, &b](CmdData& rx) {
+                          a = rx.nextArg_ui32();
+                          b = rx.nextArg_ui32();
+                          return STATUS_OK;
+                      });
 }
 
 STATUS_T CmdOut_AddJob(const Job& job, int& index)
 {
-    QMutexLocker lock(&s_jobMutex);
-    CmdData cmdTx;
-    CmdData cmdRx;
-    try {
-        cmdTx.setCommandCode(CMD_ADD_JOB);
-        cmdTx.appendJobDescription(job);
-        cmdRx = Commands::instance()->sendAndReceive(cmdTx, false, TIMEOUT_MS);
-        const STATUS_T status = cmdRx.getStatus();
-        if (status == STATUS_OK)
-            index = cmdRx.nextArg_si32();
-        return status;
-    } catch (unsigned int status) {
-        return status;
-    }
+    return runCommand(s_jobMutex, CMD_ADD_JOB, false, DEFAULT_COMMAND_TIMEOUT_MS,
+                      [&job](CmdData& tx) { tx.appendJobDescription(job); },
+                      [&index](CmdData& rx) {
+                          const STATUS_T status = rx.getStatus();
+                          if (status == STATUS_OK)
+                              index = rx.nextArg_si32();
+                          return status;
+                      });
 }
 
 STATUS_T CmdOut_DeleteJob(const QString& fileID)
 {
-    QMutexLocker lock(&s_jobMutex);
-    CmdData cmdTx;
-    CmdData cmdRx;
-    try {
-        cmdTx.setCommandCode(CMD_DELETE_JOB);
-        cmdTx.appendString(fileID);
-        cmdRx = Commands::instance()->sendAndReceive(cmdTx, false, TIMEOUT_MS);
-        return cmdRx.getStatus();
-    } catch (unsigned int status) {
-        return status;
-    }
+    return runCommand(s_jobMutex, CMD_DELETE_JOB, false, DEFAULT_COMMAND_TIMEOUT_MS,
+                      [&fileID](CmdData& tx) { tx.appendString(fileID); }, statusOnly);
 }
 
 STATUS_T CmdOut_EditJob(const QString& fileID, const Job& job)
 {
-    QMutexLocker lock(&s_jobMutex);
-    CmdData cmdTx;
-    CmdData cmdRx;
-    try {
-        cmdTx.setCommandCode(CMD_EDIT_JOB);
-        cmdTx.appendString(fileID);
-        cmdTx.appendJobDescription(job);
-        cmdRx = Commands::instance()->sendAndReceive(cmdTx, false, TIMEOUT_MS);
-        return cmdRx.getStatus();
-    } catch (unsigned int status) {
-        return status;
-    }
+    return runCommand(s_jobMutex, CMD_EDIT_JOB, false, DEFAULT_COMMAND_TIMEOUT_MS,
+                      [&fileID, &job](CmdData& tx) {
+                          tx.appendString(fileID);
+                          tx.appendJobDescription(job);
+                      },
+                      statusOnly);
 }
 
 STATUS_T CmdOut_SetJobSaved(const QString& fileID)
 {
-    QMutexLocker lock(&s_jobMutex);
-    CmdData cmdTx;
-    CmdData cmdRx;
-    try {
-        cmdTx.setCommandCode(CMD_SET_JOB_SAVED);
-        cmdTx.appendString(fileID);
-        cmdRx = Commands::instance()->sendAndReceive(cmdTx, true, TIMEOUT_MS);
-        return STATUS_OK;
-    } catch (unsigned int status) {
-        return status;
-    }
+    return runCommand(s_jobMutex, CMD_SET_JOB_SAVED, true, DEFAULT_COMMAND_TIMEOUT_MS,
+                      [&fileID](CmdData& tx) { tx.appendString(fileID); }, nothingRead);
 }
 
 STATUS_T CmdOut_DeleteSample(const QString& fileID, int index)
 {
-    QMutexLocker lock(&s_jobMutex);
-    CmdData cmdTx;
-    CmdData cmdRx;
-    try {
-        cmdTx.setCommandCode(CMD_DELETE_SAMPLE);
-        cmdTx.appendString(fileID);
-        cmdTx.append_ui8(char(index & 0xFF));
-        cmdRx = Commands::instance()->sendAndReceive(cmdTx, true, TIMEOUT_MS);
-        return STATUS_OK;
-    } catch (unsigned int status) {
-        return status;
-    }
+    return runCommand(s_jobMutex, CMD_DELETE_SAMPLE, true, DEFAULT_COMMAND_TIMEOUT_MS,
+                      [&fileID, index](CmdData& tx) {
+                          tx.appendString(fileID);
+                          tx.append_ui8(char(index & 0xFF));
+                      },
+                      nothingRead);
 }

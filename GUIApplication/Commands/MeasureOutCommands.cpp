@@ -21,8 +21,10 @@ constexpr long CMD_FORCE_FINISH_SMC = 0x40010060;
 constexpr long CMD_GET_TEMPERATURE = 0x400A0E22;
 constexpr long CMD_TRIGGER_MEASUREMENT = 0x41000000;
 constexpr long CMD_GET_SAMPLE = 0x41000100;
-constexpr int TIMEOUT_MS = 4000;
 constexpr int REFINISH_SAMPLE_TIMEOUT_MS = 11000;
+// The camera's own size, asked for with texture figures.
+constexpr unsigned short TEXTURE_IMAGE_WIDTH = 482;
+constexpr unsigned short TEXTURE_IMAGE_HEIGHT = 348;
 
 // Spectral channel types of a curve.
 constexpr int CHANNEL_SPECTRUM = 0;
@@ -206,41 +208,21 @@ bool isMeasurementStatus(STATUS_T status)
 STATUS_T singleAngle(IMAGE_ANGLE_T angle, const QString& fileID, int index, IMAGE_CHANNEL_CONTENT_TYPE content,
                      unsigned short width, unsigned short height, const std::function<void(CmdData&)>& read)
 {
-    QMutexLocker lock(&s_measureMutex);
-    CmdData cmdTx;
-    CmdData cmdRx;
-    try {
-        cmdTx.setCommandCode(CMD_GET_SAMPLE);
-        appendSampleRequest(cmdTx, fileID, index, singleAngleRequest(angle, content, width, height));
-        cmdRx = Commands::instance()->sendAndReceive(cmdTx, true, TIMEOUT_MS);
-        cmdRx.nextArgString();
-        cmdRx.nextArg_si8();
-        cmdRx.nextArgSampleInfo();
-        cmdRx.nextArg_si32();
-        cmdRx.nextArgString();
-        cmdRx.nextArg_si32();
-        if (cmdRx.nextArg_si32() == content)
-            read(cmdRx);
-        cmdRx.nextArg_si32();
-        return STATUS_OK;
-    } catch (unsigned int status) {
-        return status;
-    }
-}
-
-STATUS_T sendWithoutReply(long code, const std::function<void(CmdData&)>& arguments)
-{
-    QMutexLocker lock(&s_measureMutex);
-    CmdData cmdTx;
-    CmdData cmdRx;
-    try {
-        cmdTx.setCommandCode(code);
-        arguments(cmdTx);
-        cmdRx = Commands::instance()->sendAndReceive(cmdTx, true, TIMEOUT_MS);
-        return STATUS_OK;
-    } catch (unsigned int status) {
-        return status;
-    }
+    return runCommand(
+        s_measureMutex, CMD_GET_SAMPLE, true, DEFAULT_COMMAND_TIMEOUT_MS,
+        [&](CmdData& tx) { appendSampleRequest(tx, fileID, index, singleAngleRequest(angle, content, width, height)); },
+        [&](CmdData& rx) {
+            rx.nextArgString();
+            rx.nextArg_si8();
+            rx.nextArgSampleInfo();
+            rx.nextArg_si32();
+            rx.nextArgString();
+            rx.nextArg_si32();
+            if (rx.nextArg_si32() == content)
+                read(rx);
+            rx.nextArg_si32();
+            return STATUS_OK;
+        });
 }
 
 } // namespace
@@ -253,78 +235,61 @@ void MeasureOut_SetActiveJobNameSource(ActiveJobNameSource source)
 
 STATUS_T CmdOut_TriggerMeasurement()
 {
-    QString jobName;
+    ActiveJobNameSource source;
     {
-        ActiveJobNameSource source;
-        {
-            QMutexLocker lock(&sourceMutex());
-            source = activeJobName();
-        }
-        if (source)
-            jobName = source();
+        QMutexLocker lock(&sourceMutex());
+        source = activeJobName();
     }
-
-    QMutexLocker lock(&s_measureMutex);
-    CmdData cmdTx;
-    CmdData cmdRx;
-    try {
-        cmdTx.setCommandCode(CMD_TRIGGER_MEASUREMENT);
-        cmdTx.appendString(jobName);
-        cmdRx = Commands::instance()->sendAndReceive(cmdTx, false, TIMEOUT_MS);
-        return cmdRx.getStatus();
-    } catch (unsigned int status) {
-        return status;
-    }
+    const QString jobName = source ? source() : QString();
+    return runCommand(s_measureMutex, CMD_TRIGGER_MEASUREMENT, false, DEFAULT_COMMAND_TIMEOUT_MS,
+                      [&jobName](CmdData& tx) { tx.appendString(jobName); },
+                      [](CmdData& rx) { return rx.getStatus(); });
 }
 
 STATUS_T CmdOut_GetSpectralResult()
 {
-    return sendWithoutReply(CMD_GET_SPECTRAL_RESULT, [](CmdData&) {});
+    return runCommand(s_measureMutex, CMD_GET_SPECTRAL_RESULT, true, DEFAULT_COMMAND_TIMEOUT_MS, noArguments,
+                      nothingRead);
 }
 
 STATUS_T CmdOut_GetImageResult()
 {
-    return sendWithoutReply(CMD_GET_IMAGE_RESULT, [](CmdData&) {});
+    return runCommand(s_measureMutex, CMD_GET_IMAGE_RESULT, true, DEFAULT_COMMAND_TIMEOUT_MS, noArguments,
+                      nothingRead);
 }
 
 STATUS_T CmdOut_ForceFinishSMC(const QString& fileID)
 {
-    return sendWithoutReply(CMD_FORCE_FINISH_SMC, [&fileID](CmdData& cmd) { cmd.appendString(fileID); });
+    return runCommand(s_measureMutex, CMD_FORCE_FINISH_SMC, true, DEFAULT_COMMAND_TIMEOUT_MS,
+                      [&fileID](CmdData& tx) { tx.appendString(fileID); }, nothingRead);
 }
 
 STATUS_T CmdOut_GetRefinishSample(Sample& sample, const QString& fileID, int index)
 {
-    QMutexLocker lock(&s_measureMutex);
-    CmdData cmdTx;
-    CmdData cmdRx;
-    try {
-        cmdTx.setCommandCode(CMD_GET_SAMPLE);
-        SampleRequest request;
-        request.imageAngles << QStringLiteral("ALL");
-        request.spectralAngles << QStringLiteral("ALL");
-        request.imageContents << IMAGE_CHANNEL_CONTENT_TYPE_THUMBNAIL;
-        request.spectralContents << CHANNEL_SPECTRUM << CHANNEL_LAB << CHANNEL_LCH;
-        request.width = Sample::THUMBNAIL_WIRE_WIDTH;
-        request.height = Sample::THUMBNAIL_WIRE_HEIGHT;
-        appendSampleRequest(cmdTx, fileID, index, request);
-        cmdRx = Commands::instance()->sendAndReceive(cmdTx, false, REFINISH_SAMPLE_TIMEOUT_MS);
+    SampleRequest request;
+    request.imageAngles << QStringLiteral("ALL");
+    request.spectralAngles << QStringLiteral("ALL");
+    request.imageContents << IMAGE_CHANNEL_CONTENT_TYPE_THUMBNAIL;
+    request.spectralContents << CHANNEL_SPECTRUM << CHANNEL_LAB << CHANNEL_LCH;
+    request.width = Sample::THUMBNAIL_WIRE_WIDTH;
+    request.height = Sample::THUMBNAIL_WIRE_HEIGHT;
 
-        // A finished measurement's own status comes with its data.
-        const STATUS_T status = cmdRx.getStatus();
-        if (status != STATUS_OK && !isMeasurementStatus(status))
-            return status;
-
-        sample.setJobFileID(cmdRx.nextArgString());
-        // The averaged sample is 255 on the wire: the byte is taken unsigned.
-        sample.setFileID(static_cast<unsigned char>(cmdRx.nextArg_si8()));
-        sample.setSampleInfo(cmdRx.nextArgSampleInfo());
-        readImageChannels(cmdRx, sample);
-        readCurves(cmdRx, sample);
-        sample.setColorFilledIn(true);
-        return status;
-    } catch (unsigned int status) {
-        return status;
-    }
+    return runCommand(s_measureMutex, CMD_GET_SAMPLE, false, REFINISH_SAMPLE_TIMEOUT_MS,
+                      [&](CmdData& tx) { appendSampleRequest(tx, fileID, index, request); },
+                      [&sample](CmdData& rx) {
+                          // A finished measurement's own status comes with its data.
+                          const STATUS_T status = rx.getStatus();
+                          if (status != STATUS_OK && !isMeasurementStatus(status))
+                              return status;
+                          sample.setJobFileID(rx.nextArgString());
+                          // The averaged sample is 255 on the wire: the byte is taken unsigned.
+                          sample.setFileID(static_cast<unsigned char>(rx.nextArg_si8()));
+                          sample.setSampleInfo(rx.nextArgSampleInfo());
+                          readImageChannels(rx, sample);
+                          readCurves(rx, sample);
+                          sample.setColorFilledIn(true);
+                          return status;
+                      });
 }
 
 STATUS_T CmdOut_GetAngleFullImage(IMAGE_ANGLE_T angle, const QString& fileID, int index, QByteArray& image)
@@ -335,29 +300,23 @@ STATUS_T CmdOut_GetAngleFullImage(IMAGE_ANGLE_T angle, const QString& fileID, in
 
 STATUS_T CmdOut_GetAngleTexture(IMAGE_ANGLE_T angle, const QString& fileID, int index, TEXTURE_T& texture)
 {
-    return singleAngle(angle, fileID, index, IMAGE_CHANNEL_CONTENT_TYPE_TEXTURE, 482, 348,
-                       [&texture](CmdData& rx) { texture = nextArgTexture(rx); });
+    return singleAngle(angle, fileID, index, IMAGE_CHANNEL_CONTENT_TYPE_TEXTURE, TEXTURE_IMAGE_WIDTH,
+                       TEXTURE_IMAGE_HEIGHT, [&texture](CmdData& rx) { texture = nextArgTexture(rx); });
 }
 
 STATUS_T CmdOut_GetAngleTextureParameters(IMAGE_ANGLE_T angle, const QString& fileID, int index,
                                           QVector<TEXTURE_PARAMETER_T>& parameters)
 {
-    return singleAngle(angle, fileID, index, IMAGE_CHANNEL_CONTENT_TYPE_TEXTURE_PARAMETER, 482, 348,
-                       [&parameters](CmdData& rx) { parameters = nextArgTextureParameters(rx); });
+    return singleAngle(angle, fileID, index, IMAGE_CHANNEL_CONTENT_TYPE_TEXTURE_PARAMETER, TEXTURE_IMAGE_WIDTH,
+                       TEXTURE_IMAGE_HEIGHT, [&parameters](CmdData& rx) { parameters = nextArgTextureParameters(rx); });
 }
 
 STATUS_T CmdOut_GetTemperature(float& value, unsigned short sensor)
 {
-    QMutexLocker lock(&s_measureMutex);
-    CmdData cmdTx;
-    CmdData cmdRx;
-    try {
-        cmdTx.setCommandCode(CMD_GET_TEMPERATURE);
-        cmdTx.append_ui16(sensor);
-        cmdRx = Commands::instance()->sendAndReceive(cmdTx, true, TIMEOUT_MS);
-        value = cmdRx.nextArg_f32();
-        return STATUS_OK;
-    } catch (unsigned int status) {
-        return status;
-    }
+    return runCommand(s_measureMutex, CMD_GET_TEMPERATURE, true, DEFAULT_COMMAND_TIMEOUT_MS,
+                      [sensor](CmdData& tx) { tx.append_ui16(sensor); },
+                      [&value](CmdData& rx) {
+                          value = rx.nextArg_f32();
+                          return STATUS_OK;
+                      });
 }

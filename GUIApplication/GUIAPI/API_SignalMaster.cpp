@@ -10,6 +10,13 @@ API_SignalMaster* API_SignalMaster::instance()
 API_SignalMaster::API_SignalMaster(QObject* parent)
     : QObject(parent)
 {
+    // Whatever the start-up order, the hub's own arguments can be queued to
+    // another thread as soon as the hub exists.
+    qRegisterMetaType<SystemStatus>("SystemStatus");
+    qRegisterMetaType<TEST>("TEST");
+    qRegisterMetaType<PRESSURE_SWITCH_T>("PRESSURE_SWITCH_T");
+    qRegisterMetaType<ACCELEROMETER_ORIENTATION_T>("ACCELEROMETER_ORIENTATION_T");
+    qRegisterMetaType<Sample>("Sample");
 }
 
 void API_SignalMaster::Init()
@@ -156,13 +163,10 @@ void API_SignalMaster::emitOrientationUpdated(const ACCELEROMETER_ORIENTATION_T&
     emit OrientationUpdated(orientation);
 }
 
-#ifdef MARIGOLD_HAVE_SAMPLE
 void API_SignalMaster::emitAddedSample(const Sample& sample)
 {
     emit AddedSample(sample);
 }
-
-#endif
 
 void API_SignalMaster::emitGoHome()
 {

@@ -13,7 +13,6 @@
 #include <QObject>
 
 #include "SharedSystem/Sample.h"
-#define MARIGOLD_HAVE_SAMPLE 1
 
 class API_SignalMaster : public QObject
 {
@@ -63,9 +62,7 @@ public:
     void emitTargetingImageUpdated(const QByteArray& image);
     void emitPressureSwitchesUpdated(const PRESSURE_SWITCH_T& pressure);
     void emitOrientationUpdated(const ACCELEROMETER_ORIENTATION_T& orientation);
-#ifdef MARIGOLD_HAVE_SAMPLE
     void emitAddedSample(const Sample& sample);
-#endif
     void emitGoHome();
     void emitGoToWhiteCalibration();
     void emitGoToRefCheck();
@@ -127,9 +124,7 @@ signals:
     void TargetingImageUpdated(const QByteArray& image);
     void PressureSwitchesUpdated(const PRESSURE_SWITCH_T& pressure);
     void OrientationUpdated(const ACCELEROMETER_ORIENTATION_T& orientation);
-#ifdef MARIGOLD_HAVE_SAMPLE
     void AddedSample(const Sample& sample);
-#endif
     void GoHome();
     void GoToWhiteCalibration();
     void GoToRefCheck();

@@ -1,5 +1,7 @@
 #include "SharedSystem/Instrument.h"
 
+#include "Commands/SystemOutCommands.h"
+
 #include <QCoreApplication>
 #include <QElapsedTimer>
 
@@ -22,6 +24,14 @@ void setIpAddress(QString address) { ipAddress = address; }
 QString getIpAddress() { return ipAddress; }
 void setIpPort(int port) { ipPort = port; }
 int getIpPort() { return ipPort; }
+
+void Instrument_Determine_Model_Type()
+{
+    int id = 0;
+    QString configuration;
+    CmdOut_GetConfiguration(id, configuration);
+    Instrument_Set_Model_Type(configuration == QLatin1String("ALDER") ? MODEL_REFINISH_ALDER : MODEL_REFINISH_BIRCH);
+}
 
 MODEL_TYPES_T Instrument_Get_Model_Type()
 {

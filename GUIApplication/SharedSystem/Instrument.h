@@ -13,6 +13,9 @@ QString getIpAddress();
 void setIpPort(int port);
 int getIpPort();
 
+// Asks the server for its configuration: "ALDER" is the 11-angle, 5-camera
+// instrument, everything else (a failed question too) the 6-angle BIRCH.
+void Instrument_Determine_Model_Type();
 MODEL_TYPES_T Instrument_Get_Model_Type();
 // For a model known by other means (the simulator, tests).
 void Instrument_Set_Model_Type(MODEL_TYPES_T model);

@@ -1,6 +1,7 @@
 #include "SharedSystem/Job.h"
 
 #include "SharedSystem/UserParams.h"
+#include "Utils/ConversionHelper.h"
 
 #include <QMutex>
 #include <QMutexLocker>
@@ -259,6 +260,13 @@ QDateTime Job::getDateComplete() const
             latest = stamp;
     }
     return latest;
+}
+
+QString Job::getDateCompletedString() const
+{
+    if (m_sampleList.isEmpty())
+        return QString();
+    return convertDateTimeToString(getDateComplete());
 }
 
 bool Job::isJobComplete() const

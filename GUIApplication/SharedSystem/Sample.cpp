@@ -1,6 +1,8 @@
 #include "SharedSystem/Sample.h"
 
+#include "GUIAPI/ColorAPI.h"
 #include "SharedSystem/Instrument.h"
+#include "Utils/ConversionHelper.h"
 
 #include <QDebug>
 #include <QMutexLocker>
@@ -248,6 +250,11 @@ QString Sample::getTimeStampString(const QString& format) const
     return m_sampleInfo.timeStamp.toString(format);
 }
 
+QString Sample::getTimeStampString() const
+{
+    return convertDateTimeToString(getTimeStamp());
+}
+
 void Sample::setNumAngleCurves(unsigned int count)
 {
     SAMPLE_LOCK
@@ -359,6 +366,16 @@ LCH_T Sample::getLch(int angle) const
     lch.c = v.c;
     lch.h = v.h;
     return lch;
+}
+
+QColor Sample::getColor(int angle) const
+{
+    SAMPLE_LOCK
+    // A failed conversion shows black rather than whatever was in memory.
+    COLORSPACE_OBJECT_T rgb = {0.0f, 0.0f, 0.0f, 255.0f};
+    ColorAPI_GetRGBValues(const_cast<double*>(m_Refl[reflAngleOrZero(angle)]), &rgb);
+    return QColor(qBound(0, int(rgb.ColorVal1), 255), qBound(0, int(rgb.ColorVal2), 255),
+                  qBound(0, int(rgb.ColorVal3), 255), 255);
 }
 
 void Sample::setImageFileID(int angle, unsigned int id)

@@ -4,6 +4,9 @@
 #include "Utils/ColorMathHelper.h"
 
 #include <cmath>
+#if defined(__SSE2__)
+#include <emmintrin.h>
+#endif
 
 // Hunter Ka and Kb as tabulated for each pair; they follow
 // Ka = 175 (Xn + Yn) / 198.04 and Kb = 70 (Yn + Zn) / 218.11 only to the
@@ -92,10 +95,30 @@ void sumWeights(const double* refls, const XYZ_WEIGHTS_T& w, double* X, double* 
     *Z = z;
 }
 
+// A linear screen value clamped to 0 (NaN too) and 0.999 (as float), then
+// ColorMathHelper_Round of it x 1000: an index 0..999 into FGAMMA. The
+// clamps are min/max, not branches, which would mispredict on real colours.
+inline int32_t gammaIndex(double linear)
+{
+    const double top = double(0.999f);
+#if defined(__SSE2__)
+    // The compiler turns the portable form into branches; MAXSD gives its
+    // second operand, 0, for NaN.
+    const double v = _mm_cvtsd_f64(_mm_min_sd(_mm_max_sd(_mm_set_sd(linear), _mm_setzero_pd()), _mm_set_sd(top)));
+#else
+    double v = 0.0 < linear ? linear : 0.0;
+    v = v < top ? v : top;
+#endif
+    const double scaled = v * 1000.0; // 0..999.00001: rounding needs no range checks
+    int32_t index = int32_t(scaled);
+    index += int32_t(scaled - index >= 0.5);
+    return index;
+}
+
 // The screen path (spectrum, XYZ, RGB) runs at every repaint of a colour
 // patch; these bodies are called directly, not through the exported
 // symbols, so that the compiler can inline them.
-bool reflToXYZ(const double* refls, int illumobsnr, XYZCOORD* pXYZ)
+inline bool reflToXYZ(const double* refls, int illumobsnr, XYZCOORD* pXYZ)
 {
     if (!refls || !pXYZ || !validPair(illumobsnr))
         return false;
@@ -114,27 +137,18 @@ bool reflToXYZ(const double* refls, int illumobsnr, XYZCOORD* pXYZ)
     return true;
 }
 
-bool xyzToRGB(const XYZCOORD* xyz, COLOR_REF* pcr)
+inline bool xyzToRGB(const XYZCOORD* xyz, COLOR_REF* pcr)
 {
     if (!xyz || !pcr)
         return false;
     // Not normalised to any white: a perfect white saturates all three.
-    double linear[3] = {
+    const double linear[3] = {
         0.056507956 * xyz->X - 0.027365549 * xyz->Y - 0.008413978 * xyz->Z,
         -0.014958500 * xyz->X + 0.026018254 * xyz->Y + 0.000538549 * xyz->Z,
         0.000739082 * xyz->X - 0.002633301 * xyz->Y + 0.012043483 * xyz->Z,
     };
-    const double top = double(0.999f);
-    COLOR_REF cr = 0;
-    for (int k = 0; k < 3; ++k) {
-        // Clamped without branches (they would mispredict on real colours);
-        // NaN goes to 0.
-        double v = linear[k] >= 0.0 ? linear[k] : 0.0;
-        v = v > top ? top : v;
-        const int32_t index = ColorMathHelper_Round(v * 1000.0);
-        cr += COLOR_REF(FGAMMA[index < 999 ? index : 999]) << (8 * k);
-    }
-    *pcr = cr;
+    *pcr = COLOR_REF(FGAMMA[gammaIndex(linear[0])]) + COLOR_REF(FGAMMA[gammaIndex(linear[1])]) * 256u
+           + COLOR_REF(FGAMMA[gammaIndex(linear[2])]) * 65536u;
     return true;
 }
 

@@ -9,6 +9,9 @@
 #include <QSignalSpy>
 #include <QtTest>
 
+#include <QThread>
+
+#include <atomic>
 #include <functional>
 #include <memory>
 
@@ -159,6 +162,40 @@ private slots:
         // Unvalidated, the caller sees the server's own code.
         CmdData loose = command(0x40010030);
         QCOMPARE(Commands::instance()->sendAndReceive(loose, false, 4000).getStatus(), 9u);
+    }
+
+    void oneTransactionAtATimeAcrossThreads()
+    {
+        freshLink();
+        // Slow, split replies widen the window in which two callers could mix.
+        m_peer->setResponder([](const QByteArray& f) {
+            ScriptedPeer::Reply reply;
+            reply.chunks = ScriptedPeer::split(ScriptedPeer::replyTo(f, 0, QByteArray(3000, 'r')), 1000);
+            return reply;
+        });
+        std::atomic<int> failures{0};
+        auto worker = [&failures] {
+            for (int i = 0; i < 100; ++i) {
+                CmdData cmd = command(0x10000000);
+                try {
+                    if (Commands::instance()->sendAndReceive(cmd, true, 4000).getPacketlength() != 3000)
+                        ++failures;
+                } catch (unsigned int) {
+                    ++failures;
+                }
+            }
+        };
+        std::unique_ptr<QThread> a(QThread::create(worker));
+        std::unique_ptr<QThread> b(QThread::create(worker));
+        a->start();
+        b->start();
+        // Meanwhile the watchdog ticks on this thread against the same link.
+        QTRY_VERIFY_WITH_TIMEOUT(a->isFinished() && b->isFinished(), 60000);
+        QCOMPARE(failures.load(), 0);
+        QSet<short> ids;
+        for (const QByteArray& frame : m_peer->receivedFrames())
+            ids.insert(transactionOf(frame));
+        QCOMPARE(ids.size(), 200);
     }
 
     void transportFailuresAreLoggedWithTheLastTwoHexDigits()

@@ -228,8 +228,11 @@ private slots:
         job.clearAveragedSample();
         QVERIFY(!job.getAveragedSampleComplete());
 
+        QCOMPARE(job.getDateCompletedString(), QString("9:00:00 am 03/01/24"));
+
         Job empty;
         QCOMPARE(empty.getDateComplete().toSecsSinceEpoch(), qint64(0));
+        QVERIFY(empty.getDateCompletedString().isEmpty());
         QVERIFY(jobLessThan(empty, job));
         QVERIFY(!jobLessThan(job, empty));
     }

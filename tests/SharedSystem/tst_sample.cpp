@@ -2,6 +2,7 @@
 // lock.
 #include "SharedSystem/Instrument.h"
 #include "SharedSystem/Sample.h"
+#include "SharedSystem/UserParams.h"
 
 #include <QtTest>
 
@@ -225,6 +226,33 @@ private slots:
         QVERIFY(copy.hasImage(2));
         QVERIFY(copy.getColorFilledIn());
         QVERIFY(!sample.hasImage(2));
+    }
+
+    void screenColourAndTimeText()
+    {
+        UserParams::setDefaults();
+        Sample sample;
+        double white[NUM_WAVELENGTHS];
+        for (double& v : white)
+            v = 1.0;
+        sample.setReflectances(REFL_D45_45, white);
+        QCOMPARE(sample.getColor(REFL_D45_45), QColor(255, 255, 255));
+        QCOMPARE(sample.getColor(REFL_D45_45).alpha(), 255);
+        // Black, and an angle beyond the curves reads angle 0.
+        QCOMPARE(sample.getColor(REFL_D45_NEG_15), QColor(0, 0, 0));
+        QCOMPARE(sample.getColor(9), sample.getColor(0));
+
+        double grey[NUM_WAVELENGTHS];
+        for (double& v : grey)
+            v = 0.2;
+        sample.setReflectances(0, grey);
+        const QColor patch = sample.getColor(0);
+        for (int channel : {patch.red(), patch.green(), patch.blue()})
+            QVERIFY(channel > 60 && channel < 230);
+
+        sample.setTimeStamp(QDateTime(QDate(2020, 2, 1), QTime(14, 5, 9)));
+        QCOMPARE(sample.getTimeStampString(), QString("2:05:09 pm 02/01/20"));
+        QCOMPARE(sample.getTimeStampString("yyyy-MM-dd"), QString("2020-02-01"));
     }
 
     void readersAndAWriterShareOneSample()

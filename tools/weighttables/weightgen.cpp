@@ -116,6 +116,14 @@ Spectrum columnOf(const CsvData& data, size_t index)
     return s;
 }
 
+size_t columnIndex(const CsvData& data, const std::string& column, const std::string& path)
+{
+    for (size_t i = 0; i < data.names.size(); ++i)
+        if (data.names[i] == column)
+            return i;
+    throw fail(path, "no column " + column);
+}
+
 // Solves A x = b in place by Gaussian elimination with partial pivoting.
 std::vector<double> solve(std::vector<std::vector<double>> a, std::vector<double> b)
 {
@@ -161,13 +169,9 @@ double Spectrum::at(int nm) const
 {
     if (!covers(nm))
         throw std::runtime_error("wavelength " + std::to_string(nm) + " nm outside the data");
-    const int offset = nm - first;
-    const int i = offset / step;
-    const int rest = offset % step;
-    if (rest == 0)
-        return values[size_t(i)];
-    const double t = double(rest) / step;
-    return values[size_t(i)] * (1.0 - t) + values[size_t(i) + 1] * t;
+    if ((nm - first) % step != 0)
+        throw std::runtime_error("wavelength " + std::to_string(nm) + " nm between the samples");
+    return values[size_t((nm - first) / step)];
 }
 
 double Weights::sum(int channel) const
@@ -181,10 +185,7 @@ double Weights::sum(int channel) const
 Spectrum readColumn(const std::string& path, const std::string& column)
 {
     const CsvData data = readCsv(path);
-    for (size_t i = 0; i < data.names.size(); ++i)
-        if (data.names[i] == column)
-            return columnOf(data, i);
-    throw fail(path, "no column " + column);
+    return columnOf(data, columnIndex(data, column, path));
 }
 
 Observer readObserver(const std::string& path)
@@ -506,9 +507,7 @@ std::vector<long long> densityWeights(const std::string& dataDir)
             std::vector<double> row(31, 0.0);
             if (status) {
                 const std::string name = response == 0 ? "visual_log10" : std::string(status) + responses[response - 1];
-                const size_t index = size_t(std::find(data.names.begin(), data.names.end(), name) - data.names.begin());
-                if (index >= data.names.size())
-                    throw fail(path, "no column " + name);
+                const size_t index = columnIndex(data, name, path);
                 double sum = 0.0;
                 for (int i = 0; i < 31; ++i) {
                     const int nm = 400 + 10 * i;

@@ -28,7 +28,7 @@ struct Spectrum
 
     int last() const { return first + step * (int(values.size()) - 1); }
     bool covers(int nm) const { return nm >= first && nm <= last(); }
-    double at(int nm) const; // exact sample, or linear between samples
+    double at(int nm) const; // the sample at nm; throws off the grid
 };
 
 // Colour-matching functions at 1 nm.

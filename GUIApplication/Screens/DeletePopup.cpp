@@ -1,0 +1,73 @@
+#include "Screens/DeletePopup.h"
+
+#include "Screens/PopupForm.h"
+#include "Widgets/KLabel.h"
+#include "Widgets/XPushButton.h"
+
+#include <QLabel>
+
+void Ui::DeletePopup::setupUi(QWidget* popup)
+{
+    labelBackground = PopupForm::dimmer(popup, "labelBackground");
+    labelPanel = PopupForm::card(popup, true, "labelPanel");
+    labelIcon = PopupForm::icon(popup, ":/Assets/delete_icon.png", "labelIcon");
+    labelHeader = PopupForm::title(popup, "labelHeader");
+    labelMessage = PopupForm::text(popup, "labelMessage");
+    BtnCancel = PopupForm::button(popup, "BtnCancel", PopupForm::LeftButton, Theme::SecondaryButton);
+    BtnConfirm = PopupForm::button(popup, "BtnConfirm", PopupForm::RightButton, Theme::DestructiveButton);
+    retranslateUi(popup);
+}
+
+void Ui::DeletePopup::retranslateUi(QWidget*)
+{
+    labelHeader->setText(::DeletePopup::tr("Delete All Samples?"));
+    BtnConfirm->setText(::DeletePopup::tr("Delete"));
+    BtnCancel->setText(::DeletePopup::tr("No"));
+}
+
+DeletePopup::DeletePopup(QWidget* parent)
+    : PopupPanel(parent)
+    , ui(new Ui::DeletePopup)
+{
+    setObjectName("DeletePopup");
+    ui->setupUi(this);
+    connect(ui->BtnConfirm, &QPushButton::clicked, this, &DeletePopup::onConfirmClicked);
+    connect(ui->BtnCancel, &QPushButton::clicked, this, &DeletePopup::onCancelClicked);
+}
+
+DeletePopup::~DeletePopup()
+{
+    delete ui;
+}
+
+void DeletePopup::setHeaderText(const QString& text)
+{
+    ui->labelHeader->setText(text);
+}
+
+void DeletePopup::setMessageText(const QString& text)
+{
+    ui->labelMessage->setText(text);
+}
+
+void DeletePopup::setConfirmButtonText(const QString& text)
+{
+    ui->BtnConfirm->setText(text);
+}
+
+void DeletePopup::setCancelButtonText(const QString& text)
+{
+    ui->BtnCancel->setText(text);
+}
+
+void DeletePopup::onConfirmClicked()
+{
+    playSoundButtonClick();
+    emit confirmClicked(this);
+}
+
+void DeletePopup::onCancelClicked()
+{
+    playSoundButtonClick();
+    emit cancelClicked(this);
+}
