@@ -2,7 +2,9 @@
 
 #include "Widgets/ProgressBarCircle.h"
 #include "Widgets/ProgressBarCirclePainter.h"
+#include "Widgets/SpinnyCircle.h"
 
+#include <QLabel>
 #include <QSignalSpy>
 #include <QtTest>
 
@@ -15,6 +17,7 @@ private slots:
     void painterClampsAngle();
     void emptyRangeKeepsSweep();
     void innerDiameterScalesWithWidth();
+    void spinnersShareOneAngle();
 };
 
 void tst_MeasuringPopup::sweepFollowsValue_data()
@@ -80,6 +83,38 @@ void tst_MeasuringPopup::innerDiameterScalesWithWidth()
     QCOMPARE(circle.getCircleInnerDiameterInPixels(), 140);
     circle.resize(269, 269);
     QCOMPARE(circle.getCircleInnerDiameterInPixels(), 198);
+}
+
+void tst_MeasuringPopup::spinnersShareOneAngle()
+{
+    QWidget screen;
+    SpinnyCircle first(&screen);
+    SpinnyCircle second(40, &screen);
+    QCOMPARE(first.size(), QSize(60, 60));
+    QCOMPARE(first.timeToTurn(), 250);
+    QCOMPARE(second.timeToTurn(), 40);
+    QVERIFY(!first.isTurning());
+    screen.show();
+    QVERIFY(first.isTurning());
+
+    const int start = SpinnyCircle::sharedAngle();
+    first.onTimeout();
+    second.onTimeout();
+    // Each tick moves the one shared angle: two spinners, two steps.
+    QCOMPARE(SpinnyCircle::sharedAngle(), (start + 120) % 360);
+    for (int i = 0; i < 4; ++i)
+        first.onTimeout();
+    QCOMPARE(SpinnyCircle::sharedAngle(), start);
+
+    // The turned picture stays centred on the widget.
+    QLabel* picture = first.findChild<QLabel*>(QStringLiteral("labelSpinner"));
+    QVERIFY(picture);
+    QVERIFY(qAbs(picture->geometry().center().x() - 30) <= 1);
+    QVERIFY(qAbs(picture->geometry().center().y() - 30) <= 1);
+
+    screen.hide();
+    QVERIFY(!first.isTurning());
+    QVERIFY(!second.isTurning());
 }
 
 QTEST_MAIN(tst_MeasuringPopup)

@@ -1,0 +1,36 @@
+#include "Widgets/WebSyncButton.h"
+
+#include "ui_WebSyncButton.h"
+
+#include <QEvent>
+
+WebSyncButton::WebSyncButton(QWidget* parent)
+    : FlickButton(parent)
+    , ui(new Ui::WebSyncButton)
+{
+    ui->setupUi(this);
+    setBackground(QStringLiteral(":/Assets/cell_blue_85px.png"));
+    setPressedBackground(QStringLiteral(":/Assets/cell_85px_hit.png"));
+}
+
+WebSyncButton::~WebSyncButton()
+{
+    delete ui;
+}
+
+void WebSyncButton::SetText(QString text)
+{
+    ui->labelText->setText(text);
+}
+
+QString WebSyncButton::text() const
+{
+    return ui->labelText->text();
+}
+
+void WebSyncButton::changeEvent(QEvent* event)
+{
+    if (event->type() == QEvent::LanguageChange)
+        ui->retranslateUi(this);
+    FlickButton::changeEvent(event);
+}
