@@ -1,8 +1,17 @@
 #include "GUIAPI/SystemAPI.h"
 
+#include "Commands/CalibrationOutCommands.h"
+#include "Commands/MeasureOutCommands.h"
+#include "Commands/JobOutCommands.h"
 #include "Commands/ParametersOutCommands.h"
 #include "Commands/SystemOutCommands.h"
+#include "SharedSystem/Job.h"
+#include "SharedSystem/Platform.h"
+#include "SharedSystem/Sample.h"
+
 #include "SharedSystem/UserParams.h"
+
+#include <QFile>
 
 #include <functional>
 
@@ -112,18 +121,7 @@ void setAveragingMode(const QString& text)
     JOB_AVERAGING_INFO_T info = UserParams::getJobDefaultAvgInfo();
     info.mode = jobAveragingModeFromParameter(text, info.averageNumber);
     UserParams::setJobDefaultAvgInfo(info);
-#include "Commands/CalibrationOutCommands.h"
-#include "Commands/MeasureOutCommands.h"
-#include "Commands/JobOutCommands.h"
-#include "Commands/ParametersOutCommands.h"
-#include "Commands/SystemOutCommands.h"
-#include "SharedSystem/Job.h"
-#include "SharedSystem/Platform.h"
-#include "SharedSystem/Sample.h"
-
-#include <QFile>
-
-namespace {
+}
 
 // A CmdOut_ function returns its failures, but the link below may still
 // throw; both count as false here.
@@ -260,6 +258,8 @@ bool SysAPI_SetUserParams()
     // content selection (only "parameters or not" is kept) and the web
     // server address, which the server never takes from the GUI.
     return w.ok;
+}
+
 bool SysAPI_GetWifiSettings(QVector<NETWORK_DESCRIPTION_T>& networks)
 {
     return succeeded([&] { return CmdOut_GetWifiSettings(networks); });
