@@ -288,7 +288,8 @@ STATUS_T JobBook::canMeasure(const QString& name, int limitSeconds, const QDateT
     const Job* job = find(name);
     if (!job)
         return ST_NO_SUCH_JOB;
-    if (job->state != JOB_OPEN)
+    // Readings are numbered 1 to 254 on the wire; 255 is the average.
+    if (job->state != JOB_OPEN || job->samples.size() >= AVERAGE_SAMPLE - 1)
         return ST_JOB_CLOSED;
     if (limitSeconds > 0 && job->firstMeasured.isValid() && job->firstMeasured.secsTo(now) > limitSeconds)
         return ST_JOB_TIME_ELAPSED;
