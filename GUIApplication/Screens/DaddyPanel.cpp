@@ -332,6 +332,10 @@ void DaddyPanel::onAddPopup(PopupPanel* popup)
     if (!popup)
         return;
     m_popups.push_back(popup);
+    // A popup deleted by someone else must not stay on the list.
+    connect(popup, &QObject::destroyed, this, [this](QObject* gone) {
+        m_popups.erase(std::remove(m_popups.begin(), m_popups.end(), gone), m_popups.end());
+    });
     popup->raise();
     popup->show();
 }

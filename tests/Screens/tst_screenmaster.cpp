@@ -409,6 +409,10 @@ private slots:
         home->onCloseAllPopups();
         QVERIFY(home->popups().empty());
         QCOMPARE(master.findChildren<PopupPanel*>().size(), 0);
+
+        // A popup deleted behind the panel's back leaves the list.
+        delete home->onShowErrorPopup("OK", "Error", "Gone");
+        QVERIFY(home->popups().empty());
     }
 
     void coversShareOneFieldAndTheSyncCoverClosesItself()
