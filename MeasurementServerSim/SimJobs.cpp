@@ -265,12 +265,7 @@ STATUS_T JobBook::deleteSample(const QString& name, int number)
     }
     if (job->samples.isEmpty())
         job->firstMeasured = QDateTime();
-    const int before = job->state;
-    evaluate(*job);
-    m_store.commit();
-    m_changes.measurementsChanged(job->name);
-    if (job->state != before)
-        m_changes.jobChanged(job->name);
+    readingsChanged(*job);
     return ST_OK;
 }
 
@@ -311,12 +306,17 @@ void JobBook::commitMeasurement(const QString& name, const Sample& reading)
     job->samples.append(s);
     if (!job->firstMeasured.isValid())
         job->firstMeasured = s.time;
-    const int before = job->state;
-    evaluate(*job);
+    readingsChanged(*job);
+}
+
+void JobBook::readingsChanged(Job& job)
+{
+    const int before = job.state;
+    evaluate(job);
     m_store.commit();
-    m_changes.measurementsChanged(job->name);
-    if (job->state != before)
-        m_changes.jobChanged(job->name);
+    m_changes.measurementsChanged(job.name);
+    if (job.state != before)
+        m_changes.jobChanged(job.name);
 }
 
 void JobBook::evaluate(Job& job, bool forced)

@@ -22,10 +22,6 @@
 #include <QMutexLocker>
 #include <QThread>
 
-// PENDING: these two come with the model's SystemAPI and instrument module.
-#define MARIGOLD_PENDING_SysAPI_GetUserParams() true
-#define MARIGOLD_PENDING_Instrument_Determine_Model_Type() ((void)0)
-
 namespace {
 
 const int kInterfaceVersion = 7;
@@ -218,12 +214,12 @@ bool DataManager::onSync()
 
         // Some parameter may be unknown to an older server: the instrument
         // still works with the defaults, so this alone doesn't fail the sync.
-        if (MARIGOLD_PENDING_SysAPI_GetUserParams())
+        if (SysAPI_GetUserParams())
             emit languageChanged(m_UserParameters->getLanguageCode());
         else
             qDebug() << "DataManager: issue obtaining user parameters";
 
-        MARIGOLD_PENDING_Instrument_Determine_Model_Type();
+        Instrument_Determine_Model_Type();
         getUpdatedMemInfo();
 
         if (result)

@@ -1,0 +1,5 @@
+# The stalled web sync takes its full two minutes.
+set_tests_properties(tst_synctimeout PROPERTIES LABELS "long;backend" TIMEOUT 240)
+foreach(_t tst_datamanager tst_datamanagerstartup tst_measureapi tst_syncobject)
+    set_tests_properties(${_t} PROPERTIES LABELS "backend")
+endforeach()
