@@ -242,35 +242,33 @@ void ScreenMaster::onGotoRefCheck()
     gotoCalibrationStep(CAL_WIZARD_STEPS_REF_CHECK_INSTRUCTIONS_ID);
 }
 
+void ScreenMaster::addUnlessOnTop(const char* className, SCREEN_ID_T id)
+{
+    QMutexLocker locker(&lock_);
+    QWidget* current = m_ScreenStack->currentWidget();
+    if (m_ScreenStack->count() > 0 && current
+        && QLatin1String(current->metaObject()->className()) != QLatin1String(className))
+        onAddScreenToStack(id);
+}
+
 void ScreenMaster::onGotoSadPuppy()
 {
     QMutexLocker locker(&lock_);
     onGotoHomeScreen();
     // The short word on purpose: the test passes whatever is on top, and the
     // go-home has left only the home screen.
-    QWidget* current = m_ScreenStack->currentWidget();
-    if (m_ScreenStack->count() > 0 && current
-        && QLatin1String(current->metaObject()->className()) != QLatin1String("SadPuppy"))
-        onAddScreenToStack(SAD_PUPPY_POPUP_SCREEN_ID);
+    addUnlessOnTop("SadPuppy", SAD_PUPPY_POPUP_SCREEN_ID);
 }
 
 void ScreenMaster::onGotoLockScreen()
 {
-    QMutexLocker locker(&lock_);
-    QWidget* current = m_ScreenStack->currentWidget();
     // Raised at every status snapshot while locked: one lock screen only.
-    if (m_ScreenStack->count() > 0 && current
-        && QLatin1String(current->metaObject()->className()) != QLatin1String("LockScreen"))
-        onAddScreenToStack(LOCK_SCREEN_ID);
+    addUnlessOnTop("LockScreen", LOCK_SCREEN_ID);
 }
 
 void ScreenMaster::onGotoSyncScreen()
 {
-    QMutexLocker locker(&lock_);
-    QWidget* current = m_ScreenStack->currentWidget();
-    if (m_ScreenStack->count() > 0 && current
-        && QLatin1String(current->metaObject()->className()) != QLatin1String("SyncScreen"))
-        onAddScreenToStack(SYNC_SCREEN_ID);
+    addUnlessOnTop("SyncScreen", SYNC_SCREEN_ID);
 }
 
 void ScreenMaster::onCloseLockScreen()

@@ -64,6 +64,8 @@ private:
     QWidget* createScreen(SCREEN_ID_T id);
     void activateTop();
     void gotoCalibrationStep(SCREEN_ID_T id);
+    // Adds the screen unless the current one is of that class.
+    void addUnlessOnTop(const char* className, SCREEN_ID_T id);
 
     Ui::ScreenMaster* ui;
     QStackedLayout* m_ScreenStack = nullptr;

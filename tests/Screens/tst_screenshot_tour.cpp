@@ -14,7 +14,9 @@
 #include "Screens/DaddyPanel.h"
 #include "Screens/DeletePopup.h"
 #include "Screens/ErrorPopup.h"
+#include "Screens/JobActionsPopup.h"
 #include "Screens/LockScreen.h"
+#include "Screens/MeasuringPopup.h"
 #include "Screens/NotificationPopup.h"
 #include "Screens/OverridePopup.h"
 #include "Screens/PowerDownPopup.h"
@@ -236,6 +238,8 @@ static const QList<Tour::Stop> kTour = {
          p->setConfirmButtonText("Edit");
          p->setCancelButtonText("Cancel");
      }},
+    {"popup_job_actions", [](QWidget* d) { Tour::over<JobActionsPopup>(d); }},
+    {"popup_measuring", [](QWidget* d) { Tour::over<MeasuringPopup>(d)->onUpdatePercentComplete(60); }},
     {"popup_terminate_job", [](QWidget* d) { Tour::over<TerminateJobPopup>(d); }},
     {"popup_terminate_job_es", [](QWidget* d) { Tour::over<TerminateJobPopup>(d); }, "es"},
     {"popup_power_down", [](QWidget* d) { Tour::over<PowerDownPopup>(d); }},
