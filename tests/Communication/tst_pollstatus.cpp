@@ -5,7 +5,6 @@
 
 #include "GUIAPI/BackendHarness.h"
 
-#include "AppShell.h"
 #include "GUIAPI/API_SignalMaster.h"
 #include "GUIAPI/DataManager.h"
 #include "GUIAPI/MeasureAPI.h"
@@ -66,7 +65,6 @@ private:
 
 void TestPollStatus::initTestCase()
 {
-    AppShell::registerMetaTypes();
     m_sim = startSimulator(0.3);
     QVERIFY(m_sim);
     m_relay = std::make_unique<RecordingProxy>(m_sim->port());
@@ -81,7 +79,6 @@ void TestPollStatus::initTestCase()
 
     m_dm = startDataManager();
     API_SignalMaster* hub = API_SignalMaster::instance();
-    m_log.watch(m_dm, &DataManager::DataManagerInitComplete, "InitComplete");
     m_log.watch(m_dm, &DataManager::updatePressureSensorStatus, "updatePressureSensorStatus");
     m_log.watch(hub, &API_SignalMaster::StatusUpdated, "StatusUpdated");
     m_log.watch(hub, &API_SignalMaster::MeasurementStarted, "MeasurementStarted");
@@ -93,8 +90,7 @@ void TestPollStatus::initTestCase()
     m_log.watch(hub, &API_SignalMaster::PressureSwitchesUpdated, "PressureSwitchesUpdated");
     m_log.watch(hub, &API_SignalMaster::TargetingImageUpdated, "TargetingImageUpdated");
     m_log.watch(hub, &API_SignalMaster::OrientationUpdated, "OrientationUpdated");
-    openLink(m_relay->port());
-    QVERIFY(m_log.waitFor("InitComplete", 20000));
+    QVERIFY(connectBackend(m_log, m_relay->port()));
     QCOMPARE(m_sim->control("place"), QString("OK"));
 
     const unsigned int index = onDataManagerThread([this] { return m_dm->createNewJob(); });

@@ -11,6 +11,7 @@
 // takes them queued onto the test thread (QSignalSpy is not meant to be fed
 // from another thread); their order per emitting thread is kept.
 
+#include "AppShell.h"
 #include "Communication/CmdData.h"
 #include "Communication/Commands.h"
 #include "GUIAPI/API_SignalMaster.h"
@@ -371,7 +372,9 @@ inline DataManager* startDataManager()
 {
     static bool started = false;
     if (!started) {
-        // As main does before: the tables name the angles on the wire.
+        // As main does before: types for the queued signals, and the tables
+        // that name the angles on the wire.
+        AppShell::registerMetaTypes();
         StringTables::instance();
         StringTables::Init();
         DataManagerTask::instance();
@@ -387,6 +390,15 @@ inline void openLink(quint16 port)
     setIpAddress("127.0.0.1");
     setIpPort(port);
     Commands::Init();
+}
+
+// Opens the link and waits until the back end has synchronised; the log
+// records "InitComplete" from now on.
+inline bool connectBackend(SignalLog& log, quint16 port)
+{
+    log.watch(DataManager::instance(), &DataManager::DataManagerInitComplete, "InitComplete");
+    openLink(port);
+    return log.waitFor("InitComplete", 20000);
 }
 
 } // namespace BackendHarness

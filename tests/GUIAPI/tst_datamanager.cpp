@@ -4,7 +4,6 @@
 
 #include "GUIAPI/BackendHarness.h"
 
-#include "AppShell.h"
 #include "GUIAPI/API_SignalMaster.h"
 #include "GUIAPI/DataManager.h"
 #include "GUIAPI/MeasureAPI.h"
@@ -60,12 +59,10 @@ private:
 
 void TestDataManager::initTestCase()
 {
-    AppShell::registerMetaTypes();
     m_sim = startSimulator(0.3);
     QVERIFY(m_sim);
     m_dm = startDataManager();
     API_SignalMaster* hub = API_SignalMaster::instance();
-    m_log.watch(m_dm, &DataManager::DataManagerInitComplete, "InitComplete");
     m_log.watch(m_dm, &DataManager::languageChanged, "languageChanged");
     m_log.watch(m_dm, &DataManager::beeperVolumeChanged, "beeperVolumeChanged");
     m_log.watch(m_dm, &DataManager::displayBrightnessChanged, "displayBrightnessChanged");
@@ -86,8 +83,7 @@ void TestDataManager::initTestCase()
     m_log.watch(hub, &API_SignalMaster::MeasurementIssue, "MeasurementIssue");
     m_log.watch(hub, &API_SignalMaster::MeasurementComplete, "MeasurementComplete");
     m_log.watch(hub, &API_SignalMaster::StatusUpdated, "StatusUpdated");
-    openLink(m_sim->port());
-    QVERIFY(m_log.waitFor("InitComplete", 20000));
+    QVERIFY(connectBackend(m_log, m_sim->port()));
     // As the job list screen does while it shows.
     m_dm->setFullJobUpdateFlag(true);
     onDataManagerThread([this] { m_dm->onUpdateJobInfos(); });

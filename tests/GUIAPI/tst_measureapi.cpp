@@ -4,7 +4,6 @@
 
 #include "GUIAPI/BackendHarness.h"
 
-#include "AppShell.h"
 #include "Commands/TargetingOutCommands.h"
 #include "GUIAPI/API_SignalMaster.h"
 #include "GUIAPI/DataManager.h"
@@ -47,12 +46,10 @@ private:
 
 void TestMeasureAPI::initTestCase()
 {
-    AppShell::registerMetaTypes();
     m_sim = startSimulator(0.3);
     QVERIFY(m_sim);
     m_dm = startDataManager();
     API_SignalMaster* hub = API_SignalMaster::instance();
-    m_log.watch(m_dm, &DataManager::DataManagerInitComplete, "InitComplete");
     m_log.watch(hub, &API_SignalMaster::MeasurementStarted, "MeasurementStarted");
     m_log.watch(hub, &API_SignalMaster::MeasurementIssue, "MeasurementIssue");
     m_log.watch(hub, &API_SignalMaster::MeasurementComplete, "MeasurementComplete");
@@ -61,8 +58,7 @@ void TestMeasureAPI::initTestCase()
     m_log.watch(hub, &API_SignalMaster::ReferenceCheckComplete, "ReferenceCheckComplete");
     m_log.watch(hub, &API_SignalMaster::SelfTestTestComplete, "SelfTestTestComplete");
     m_log.watch(hub, &API_SignalMaster::DisplayCalibrationPopup, "DisplayCalibrationPopup");
-    openLink(m_sim->port());
-    QVERIFY(m_log.waitFor("InitComplete", 20000));
+    QVERIFY(connectBackend(m_log, m_sim->port()));
     QCOMPARE(m_sim->control("place"), QString("OK"));
 
     // An open job to measure into.

@@ -36,16 +36,13 @@ private:
 
 void TestSyncObject::initTestCase()
 {
-    AppShell::registerMetaTypes();
     m_sim = startSimulator(0.3);
     QVERIFY(m_sim);
     m_dm = startDataManager();
     m_sync = SyncObject::instance();
-    m_log.watch(m_dm, &DataManager::DataManagerInitComplete, "InitComplete");
     m_log.watch(m_dm, &DataManager::syncJobPercent, "dmSyncJobPercent");
     m_log.watch(m_sync, &SyncObject::syncJobPercent, "syncJobPercent");
-    openLink(m_sim->port());
-    QVERIFY(m_log.waitFor("InitComplete", 20000));
+    QVERIFY(connectBackend(m_log, m_sim->port()));
     onDataManagerThread([this] { m_dm->onUpdateJobInfos(); });
     QVERIFY(m_dm->getNumberOfJobs() > 0);
 }

@@ -21,7 +21,6 @@ private slots:
 
 void TestSyncTimeout::stalledSyncReportsEveryHalfSecondForTwoMinutesThenZero()
 {
-    AppShell::registerMetaTypes();
     auto sim = startSimulator(0.3);
     QVERIFY(sim);
     RecordingProxy relay(sim->port());
@@ -34,10 +33,8 @@ void TestSyncTimeout::stalledSyncReportsEveryHalfSecondForTwoMinutesThenZero()
     DataManager* dm = startDataManager();
     SyncObject* sync = SyncObject::instance();
     SignalLog log;
-    log.watch(dm, &DataManager::DataManagerInitComplete, "InitComplete");
     log.watch(sync, &SyncObject::syncJobPercent, "syncJobPercent");
-    openLink(relay.port());
-    QVERIFY(log.waitFor("InitComplete", 20000));
+    QVERIFY(connectBackend(log, relay.port()));
     onDataManagerThread([dm] { dm->onUpdateJobInfos(); });
     QString name;
     for (const Job& job : dm->getAllJobs()) {
