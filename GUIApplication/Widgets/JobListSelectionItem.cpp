@@ -5,6 +5,8 @@
 #include "GUIAPI/DataManager.h"
 #include "SharedSystem/UserParams.h"
 
+#include "Widgets/KLabel.h"
+
 #include <QEvent>
 #include <QStringList>
 
@@ -12,12 +14,33 @@ namespace {
 
 const int kJobStateSynchronised = 2008;
 
-// The picture fills the button's box without tiling.
-QString actionStyle(const char* picture)
+// The arrow is drawn for a title bar button and sits in the middle of its
+// picture; the bin is a round badge, shown at icon size in the same 44 pixel
+// touch box.
+QString arrowStyle()
 {
     return QStringLiteral("border: none; background-color: transparent; background-repeat: no-repeat;"
-                          " background-position: center; background-image: url(%1);")
-        .arg(QLatin1String(picture));
+                          " background-position: center; background-image: url(:/Assets/next_button.png);");
+}
+
+QString binStyle()
+{
+    return QStringLiteral("border: none; background-color: transparent; margin: 15px 14px 15px 14px;"
+                          " border-image: url(:/Assets/delete_icon.png) 0 0 0 0 stretch stretch;");
+}
+
+// A rebuild of the home screen touches every row: fitting text and parsing
+// style sheets are what cost, so only what changed is set again.
+void setTextIfChanged(KLabel* label, const QString& text)
+{
+    if (label->defaultText() != text)
+        label->setText(text);
+}
+
+void setStyleIfChanged(QWidget* widget, const QString& style)
+{
+    if (widget->styleSheet() != style)
+        widget->setStyleSheet(style);
 }
 
 } // namespace
@@ -65,13 +88,13 @@ void JobListSelectionItem::onUpdateFields()
     if (complete) {
         ui->labelName->setGeometry(18, -11, 245, 41);
         ui->labelTags->setGeometry(18, 30, 245, 41);
-        ui->BtnAction->setStyleSheet(actionStyle(":/Assets/delete_icon.png"));
+        setStyleIfChanged(ui->BtnAction, binStyle());
         if (UserParams::instance()->getAllowSync())
             ui->webSyncWidget->setCompleted(m_job.getJobState() == kJobStateSynchronised);
     } else {
         ui->labelName->setGeometry(20, -1, 245, 41);
         ui->labelTags->setGeometry(20, 40, 245, 41);
-        ui->BtnAction->setStyleSheet(actionStyle(":/Assets/next_button.png"));
+        setStyleIfChanged(ui->BtnAction, arrowStyle());
     }
 }
 
@@ -79,12 +102,12 @@ void JobListSelectionItem::onTranslate()
 {
     if (!m_job.isJobValid())
         return;
-    ui->labelName->setText(m_job.getDisplayName());
+    setTextIfChanged(ui->labelName, m_job.getDisplayName());
     QStringList tags;
     for (int state = TAG_STATE_1; state < NUM_TAG_STATES; ++state)
         tags << m_job.getTagData(TAG_STATES_T(state)).displayName;
-    ui->labelTags->setText(tags.join(QLatin1Char(' ')));
-    ui->labelCompleted->setText(m_job.getDateCompletedString());
+    setTextIfChanged(ui->labelTags, tags.join(QLatin1Char(' ')));
+    setTextIfChanged(ui->labelCompleted, m_job.getDateCompletedString());
 }
 
 void JobListSelectionItem::onWifiStateChanged(WIFI_STATUS_T state)

@@ -55,6 +55,11 @@ bool WebSyncWidget::showsPicture() const
     return !m_pCompletedLabel->pixmap(Qt::ReturnByValue).isNull();
 }
 
+QPixmap WebSyncWidget::picture() const
+{
+    return m_pCompletedLabel->pixmap(Qt::ReturnByValue);
+}
+
 void WebSyncWidget::onWebSync(QString jobName, bool completed, int percentComplete)
 {
     if (jobName != m_JobName)

@@ -1,6 +1,7 @@
 #ifndef WEBSYNCWIDGET_H
 #define WEBSYNCWIDGET_H
 
+#include <QPixmap>
 #include <QStackedLayout>
 #include <QString>
 #include <QWidget>
@@ -22,6 +23,7 @@ public:
     // What the mark shows now: a percent text, or empty when a picture shows.
     QString text() const;
     bool showsPicture() const;
+    QPixmap picture() const;
 
 public slots:
     void onWebSync(QString jobName, bool completed, int percentComplete);
