@@ -1,9 +1,12 @@
 #include "AppShell.h"
 #include "GUIAPI/DataManager.h"
+#include "SharedSystem/LocaleHelper.h"
+#include "SharedSystem/StringTables.h"
+#include "Utils/AudioPlayer.h"
 #include "MyApplication.h"
+#include "Screens/ScreenMaster.h"
 
 #include <QDebug>
-#include <QLabel>
 #include <QTextCodec>
 #include <QThread>
 
@@ -29,9 +32,16 @@ int main(int argc, char* argv[])
     // 6: every toLocal8Bit() on the wire depends on this.
     QTextCodec::setCodecForLocale(QTextCodec::codecForName("utf8"));
 
-    // 7, 8: singletons and their Init() calls join here as they are built.
-    // DataManagerTask::instance() returns once its thread runs.
+    // 7: the worker tasks return only once their threads run.
+    LocaleHelper::instance();
+    StringTables::instance();
+    AudioPlayerTask::instance();
     DataManagerTask::instance();
+
+    // 8
+    LocaleHelper::Init();
+    StringTables::Init();
+    AudioPlayer::instance()->Init();
     DataManager::instance()->Init();
 
     // 9
@@ -39,10 +49,8 @@ int main(int argc, char* argv[])
     qDebug() << QString("Main/GUI Thread is Running: %1")
                     .arg(reinterpret_cast<quintptr>(QThread::currentThreadId()));
 
-    // 10: the screen stack replaces this window once it exists.
-    QLabel screen("MarigoldGUIApp");
-    screen.setAlignment(Qt::AlignCenter);
-    screen.resize(320, 480);
+    // 10
+    ScreenMaster screen;
     screen.showFullScreen();
 
     // 11

@@ -265,12 +265,7 @@ STATUS_T JobBook::deleteSample(const QString& name, int number)
     }
     if (job->samples.isEmpty())
         job->firstMeasured = QDateTime();
-    const int before = job->state;
-    evaluate(*job);
-    m_store.commit();
-    m_changes.measurementsChanged(job->name);
-    if (job->state != before)
-        m_changes.jobChanged(job->name);
+    readingsChanged(*job);
     return ST_OK;
 }
 
@@ -293,7 +288,8 @@ STATUS_T JobBook::canMeasure(const QString& name, int limitSeconds, const QDateT
     const Job* job = find(name);
     if (!job)
         return ST_NO_SUCH_JOB;
-    if (job->state != JOB_OPEN)
+    // Readings are numbered 1 to 254 on the wire; 255 is the average.
+    if (job->state != JOB_OPEN || job->samples.size() >= AVERAGE_SAMPLE - 1)
         return ST_JOB_CLOSED;
     if (limitSeconds > 0 && job->firstMeasured.isValid() && job->firstMeasured.secsTo(now) > limitSeconds)
         return ST_JOB_TIME_ELAPSED;
@@ -311,12 +307,17 @@ void JobBook::commitMeasurement(const QString& name, const Sample& reading)
     job->samples.append(s);
     if (!job->firstMeasured.isValid())
         job->firstMeasured = s.time;
-    const int before = job->state;
-    evaluate(*job);
+    readingsChanged(*job);
+}
+
+void JobBook::readingsChanged(Job& job)
+{
+    const int before = job.state;
+    evaluate(job);
     m_store.commit();
-    m_changes.measurementsChanged(job->name);
-    if (job->state != before)
-        m_changes.jobChanged(job->name);
+    m_changes.measurementsChanged(job.name);
+    if (job.state != before)
+        m_changes.jobChanged(job.name);
 }
 
 void JobBook::evaluate(Job& job, bool forced)

@@ -97,6 +97,9 @@ private:
     Job* findMutable(const QString& nameOrFileId);
     void resolveMode(Job& job, const Description& d, const Defaults& defaults) const;
     void evaluate(Job& job, bool forced = false);
+    // After readings were added or removed inside a store transaction:
+    // evaluates the job, ends the transaction and reports the change.
+    void readingsChanged(Job& job);
     void persistJob(Job& job);
 
     Store& m_store;

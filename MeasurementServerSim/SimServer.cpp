@@ -362,6 +362,10 @@ void ServerThread::call(const std::function<void(Server&)>& f)
 {
     if (!m_context || !m_server)
         return;
+    if (QThread::currentThread() == &m_thread) {
+        f(*m_server);
+        return;
+    }
     QMetaObject::invokeMethod(
         m_context, [this, &f] {
             if (m_server)

@@ -28,6 +28,8 @@
 // any code on the server's thread, for checks the control interface lacks.
 // Destroying the ServerThread stops the server; the data folder stays, so a
 // second ServerThread on the same folder is the instrument after a restart.
+// The simulator's own records (Sim::Job, Sim::Sample) live in namespace Sim;
+// keep them qualified next to the GUI's Job and Sample.
 //
 // Connections: any number of clients may be connected at once; commands are
 // served one at a time in the order they arrive. A client that drops leaves

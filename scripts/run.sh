@@ -23,9 +23,11 @@ cleanup() {
 trap cleanup INT TERM EXIT
 
 if [ -x "$build/bin/MeasurementServerSim" ]; then
-  "$build/bin/MeasurementServerSim" --port "$port" --data "$build/simdata" &
+  ctl=$((port + 1))
+  "$build/bin/MeasurementServerSim" --port "$port" --control-port "$ctl" --data "$build/simdata" --no-stdin &
   pids+=($!)
   sleep 0.5
+  echo "Simulator on 127.0.0.1:$port; drive it with: nc 127.0.0.1 $ctl  (type help; see MeasurementServerSim/README.md)"
 else
   echo "(no simulator built yet: the GUI starts alone)"
 fi

@@ -23,6 +23,7 @@ void Ui::DeletePopup::retranslateUi(QWidget*)
     labelHeader->setText(::DeletePopup::tr("Delete All Samples?"));
     BtnConfirm->setText(::DeletePopup::tr("Delete"));
     BtnCancel->setText(::DeletePopup::tr("No"));
+    PopupForm::arrange(labelIcon, labelHeader, labelMessage);
 }
 
 DeletePopup::DeletePopup(QWidget* parent)
@@ -43,11 +44,13 @@ DeletePopup::~DeletePopup()
 void DeletePopup::setHeaderText(const QString& text)
 {
     ui->labelHeader->setText(text);
+    PopupForm::arrange(ui->labelIcon, ui->labelHeader, ui->labelMessage);
 }
 
 void DeletePopup::setMessageText(const QString& text)
 {
     ui->labelMessage->setText(text);
+    PopupForm::arrange(ui->labelIcon, ui->labelHeader, ui->labelMessage);
 }
 
 void DeletePopup::setConfirmButtonText(const QString& text)

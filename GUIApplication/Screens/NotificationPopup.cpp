@@ -33,11 +33,13 @@ NotificationPopup::~NotificationPopup()
 void NotificationPopup::setHeaderText(const QString& text)
 {
     ui->labelTextTitle->setText(text);
+    PopupForm::arrange(ui->labelIcon, ui->labelTextTitle, ui->labelTextSummary);
 }
 
 void NotificationPopup::setMessageText(const QString& text)
 {
     ui->labelTextSummary->setText(text);
+    PopupForm::arrange(ui->labelIcon, ui->labelTextTitle, ui->labelTextSummary);
 }
 
 void NotificationPopup::setButtonText(const QString& text)
@@ -53,6 +55,7 @@ void NotificationPopup::setIconResource(const QString& resource)
 void NotificationPopup::setIconVisible(bool visible)
 {
     ui->labelIcon->setVisible(visible);
+    PopupForm::arrange(ui->labelIcon, ui->labelTextTitle, ui->labelTextSummary);
 }
 
 QString NotificationPopup::headerText() const

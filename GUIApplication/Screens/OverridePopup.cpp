@@ -35,11 +35,13 @@ OverridePopup::~OverridePopup()
 void OverridePopup::setTitleText(const QString& text)
 {
     ui->labelTextTitle->setText(text);
+    PopupForm::arrange(ui->labelIcon, ui->labelTextTitle, ui->labelTextSummary);
 }
 
 void OverridePopup::setBodyText(const QString& text)
 {
     ui->labelTextSummary->setText(text);
+    PopupForm::arrange(ui->labelIcon, ui->labelTextTitle, ui->labelTextSummary);
 }
 
 void OverridePopup::setConfirmButtonText(const QString& text)

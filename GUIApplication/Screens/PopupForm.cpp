@@ -3,6 +3,7 @@
 #include "Widgets/KLabel.h"
 #include "Widgets/XPushButton.h"
 
+#include <QFontMetrics>
 #include <QLabel>
 #include <QPixmap>
 
@@ -75,6 +76,31 @@ XPushButton* button(QWidget* popup, const QString& objectName, const QRect& box,
     b->setGeometry(box);
     Theme::styleButton(b, role);
     return b;
+}
+
+void arrange(QWidget* icon, KLabel* title, KLabel* text)
+{
+    const int gap = 12;
+    const int areaTop = Theme::TallCard.top() + 20;
+    const int areaBottom = WideButton.top() - 16;
+    const bool withIcon = icon && !icon->isHidden();
+
+    const QRect widest(0, 0, TextBox.width(), TextBox.height());
+    const int textHeight = qMin(TextBox.height(),
+                                QFontMetrics(text->defaultFont())
+                                    .boundingRect(widest, Qt::TextWordWrap | Qt::AlignHCenter, text->defaultText())
+                                    .height());
+    const int block = (withIcon ? IconBox.height() + gap : 0) + TitleBox.height() + 4 + textHeight;
+    int y = areaTop + qMax(0, (areaBottom - areaTop - block) / 2);
+    if (withIcon) {
+        icon->move(IconBox.x(), y);
+        y += IconBox.height() + gap;
+    }
+    title->move(TitleBox.x(), y);
+    y += TitleBox.height() + 4;
+    // The text keeps all the room down to the buttons, so a long translation
+    // still fits by shrinking.
+    text->setGeometry(TextBox.x(), y, TextBox.width(), qMax(textHeight, areaBottom - y));
 }
 
 } // namespace PopupForm

@@ -36,6 +36,11 @@ KLabel* title(QWidget* popup, const QString& objectName, const QRect& box = Titl
 KLabel* text(QWidget* popup, const QString& objectName, const QRect& box = TextBox);
 XPushButton* button(QWidget* popup, const QString& objectName, const QRect& box, Theme::ButtonRole role);
 
+// Centres icon, title and text as one block in the space above the buttons
+// of the tall card, so that a one-line message does not float under an empty
+// card. Call again whenever a text or the icon's visibility changes.
+void arrange(QWidget* icon, KLabel* title, KLabel* text);
+
 } // namespace PopupForm
 
 #endif // POPUPFORM_H

@@ -725,6 +725,41 @@ private slots:
         QCOMPARE(CmdOut_GetJobInfos(jobs), 0u);
         QVERIFY(!findJob(jobs, QStringLiteral("Smc")).getName().isEmpty());
     }
+
+    void theLargerModel()
+    {
+        Sim::ServerThread alder;
+        alder.options().instrument.dataDir = TestSupport::makeTempDir(QStringLiteral("simalder"));
+        alder.options().instrument.model = Sim::Model::Alder;
+        alder.options().instrument.timeScale = 0.2;
+        QVERIFY(alder.start());
+        const quint16 port = sim->port();
+        setIpPort(alder.port());
+        TcpClient* old = Commands::instance()->tcpClient();
+        QSignalSpy reconnected(API_SignalMaster::instance(), &API_SignalMaster::TcpReconnected);
+        Commands::Init();
+        delete old;
+        QVERIFY(reconnected.wait(5000));
+
+        int id = 0;
+        QString text;
+        QCOMPARE(CmdOut_GetConfiguration(id, text), 0u);
+        QCOMPARE(text, QStringLiteral("ALDER"));
+        Sample sample;
+        QCOMPARE(CmdOut_GetRefinishSample(sample, QStringLiteral("Job 1"), 1), 0u);
+        QCOMPARE(sample.getNumAngleCurves(), 11u);
+        QVERIFY(sample.getLab(REFL_D15_NEG_45).l > 0.0);
+        QVERIFY(!sample.getSampleThumbnail(IMAGE_80).isNull());
+        QByteArray image;
+        QCOMPARE(CmdOut_GetAngleFullImage(IMAGE_DIFFUSE, QStringLiteral("Job 1"), 1, image),
+                 STATUS_BAD_RESPONSE_STATUS);   // five cameras, no diffuse one
+        PARAMETER_CONTENT_TYPES v;
+        QCOMPARE(CmdOut_GetParameter(PARAMETER_DISPLAYED_IMAGE_CHANNELS, v), 0u);
+        QCOMPARE(v.paramterStringList.size(), 5);
+
+        setIpPort(port);
+        QVERIFY(attach());
+    }
 };
 
 QTEST_MAIN(TestSimCmdOut)

@@ -10,6 +10,8 @@
 #include <QTextCodec>
 #include <QtTest>
 
+#include <random>
+
 using namespace Sim;
 
 namespace {
@@ -142,6 +144,42 @@ private slots:
         s.write(wrong.getFullCmd());
         r = exchange(s, command(CMD_GET_SERIAL_NUM, 9));
         QCOMPARE(r.getTransactionID(), short(9));
+    }
+
+    void garbageArgumentsNeverBreakTheServer()
+    {
+        // Every command with random argument bytes: a reply each time, with
+        // the command's code and transaction, and the server goes on.
+        const quint32 codes[] = {
+            CMD_GET_STATE, CMD_GET_ERROR_DESCRIPTIONS, CMD_GET_CONFIGURATION, CMD_SET_INTERFACE_CONFIG,
+            CMD_GET_JOB_INFOS, CMD_GET_JOB_INFO, CMD_GET_JOB_INFO_WEB, CMD_ADD_JOB, CMD_EDIT_JOB,
+            CMD_FORCE_FINISH_SMC, CMD_SET_JOB_SAVED, CMD_REFERENCE_CHECK, CMD_GET_CAPABILITY,
+            CMD_SET_BEEPER_VOLUME, CMD_SET_DISPLAY_BRIGHTNESS, CMD_ADD_WIFI_SETTING, CMD_VERIFY_WIFI_SETTINGS,
+            CMD_GET_PARAMETER, CMD_SET_PARAMETER, CMD_GET_TEMPERATURE, CMD_TRIGGER_MEASUREMENT, CMD_GET_SAMPLE,
+            CMD_DELETE_SAMPLE, CMD_START_TARGETING, CMD_GET_TARGETING_INFO, CMD_GET_VERSION, CMD_GET_PREVIEW_IMAGE,
+            CMD_TRIGGER_SELF_TEST, CMD_GET_SELF_TEST_RESULT, CMD_DELETE_JOB};
+        std::mt19937 rng(99);
+        int answered = 0;
+        sim->call([&](Server& server) {
+            for (quint32 code : codes) {
+                for (int i = 0; i < 150; ++i) {
+                    QByteArray args(int(rng() % 48), Qt::Uninitialized);
+                    for (char& c : args)
+                        c = char(rng() % 4 == 0 ? rng() : rng() % 3);   // mostly small numbers, like counts
+                    const short tid = short(i);
+                    const QByteArray reply = server.protocol().handle(command(code, tid, [&](CmdData& c) {
+                        c.appendBuffer(args);
+                    }));
+                    CmdData r(reply);
+                    if (r.getIsResponse() && quint32(r.getCommandCode()) == code && r.getTransactionID() == tid)
+                        ++answered;
+                }
+            }
+        });
+        QCOMPARE(answered, int(sizeof codes / sizeof codes[0]) * 150);
+        QTcpSocket s;
+        QVERIFY(connectTo(s, sim->port()));
+        QCOMPARE(exchange(s, command(CMD_GET_STATE, 1)).getStatus(), 0u);
     }
 
     void impossibleLengthsCloseTheConnection()

@@ -4,9 +4,12 @@
 #include "GUIAPI/API_SignalMaster.h"
 #include "Screens/DeletePopup.h"
 #include "Screens/ErrorPopup.h"
+#include "Screens/LockScreen.h"
 #include "Screens/NotificationPopup.h"
 #include "Screens/OverridePopup.h"
 #include "Screens/PowerDownPopup.h"
+#include "Screens/SadPuppyScreen.h"
+#include "Screens/SyncScreen.h"
 #include "Screens/TerminateJobPopup.h"
 #include "Screens/UndoPopup.h"
 #include "SharedSystem/Platform.h"
@@ -182,6 +185,46 @@ private slots:
         QCOMPARE(home.count(), 1);
     }
 
+
+    void coversSayWhatTheyAreWaitingFor()
+    {
+        LockScreen lock;
+        QCOMPARE(lock.objectName(), QString("LockScreen"));
+        QCOMPARE(lock.title(), QString("Instrument Locked"));
+        QVERIFY(!lock.hasTimeLimit());
+
+        LockScreen limited(200, nullptr);
+        QSignalSpy closed(&limited, &DaddyPanel::CloseScreenSignal);
+        QTRY_COMPARE(closed.count(), 1);
+        QVERIFY(limited.isClosing());
+
+        SyncScreen sync;
+        QCOMPARE(sync.title(), QString("Syncing Job Data"));
+        QVERIFY(sync.hasTimeLimit());
+        QSignalSpy syncClosed(&sync, &DaddyPanel::CloseScreenSignal);
+        QTest::qWait(SyncScreen::DefaultTimeLimitMs - 300);
+        QCOMPARE(syncClosed.count(), 0);
+        QTRY_COMPARE_WITH_TIMEOUT(syncClosed.count(), 1, 1500);
+    }
+
+    void theFaultScreenAnnouncesItself()
+    {
+        QSignalSpy jobUpdate(API_SignalMaster::instance(), &API_SignalMaster::JobUpdate);
+        SadPuppyScreen fault;
+        QCOMPARE(jobUpdate.count(), 1);
+        QCOMPARE(labelText(&fault, "labelTextTitle"), QString("Error"));
+        QCOMPARE(labelText(&fault, "labelTextSummary"),
+                 QString("An error has occurred, please reboot the instrument"));
+        QCOMPARE(buttonText(&fault, "Btn"), QString("OK"));
+        // The panel's apocalypse helper plays the user error sound.
+        QTRY_VERIFY(Platform::recordedCommands().contains(played("errorUser.wav")));
+        QVERIFY(!Platform::recordedCommands().contains(played("errorApocalypse.wav")));
+
+        QSignalSpy home(&fault, &DaddyPanel::GotoHomeScreenSignal);
+        press(&fault, "Btn");
+        QCOMPARE(home.count(), 1);
+        QTRY_COMPARE(clicks(), 1);
+    }
 };
 
 QTEST_MAIN(TestPopups)
