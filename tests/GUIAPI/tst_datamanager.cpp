@@ -32,6 +32,8 @@ private slots:
     void labModeStartsAndEnds();
     void lockEmitsLockStartedAtEveryStatusAndGoHomeOnLeaving();
 
+    void activeJobAndSampleIndicesFollowTheirRules();
+    void listIsSortedByCompletionLatestFirst();
     void deletingAllSamplesGoesFromTheHighestNumberDown();
     void refreshKeepsActiveJobAndSampleByDatabaseIndex();
     void refreshDropsActiveJobAndSampleWhenTheyVanish();
@@ -287,6 +289,46 @@ void TestDataManager::lockEmitsLockStartedAtEveryStatusAndGoHomeOnLeaving()
 }
 
 // ---------------------------------------------------------------- jobs and samples
+
+void TestDataManager::activeJobAndSampleIndicesFollowTheirRules()
+{
+    const unsigned int size = m_dm->getNumberOfJobs();
+    m_dm->setActiveJob(NO_INDEX);
+    m_dm->setActiveSample(0);
+    QCOMPARE(m_dm->getActiveSample(), NO_INDEX);
+    QCOMPARE(m_dm->getCurrentNumberOfJobSamples(), 0u);
+
+    // One past the end is kept and reads as no job.
+    m_dm->setActiveJob(size);
+    QCOMPARE(m_dm->getActiveJob(), size);
+    QVERIFY(!m_dm->getActiveJobObject().isJobValid());
+    QVERIFY(!m_dm->getActiveSampleObject().isValid());
+    m_dm->setActiveJob(size + 1);
+    QCOMPARE(m_dm->getActiveJob(), NO_INDEX);
+
+    m_dm->setActiveJob(m_dm->findJobByName(m_older));
+    const unsigned int count = m_dm->getCurrentNumberOfJobSamples();
+    QCOMPARE(count, 3u);
+    m_dm->setActiveSample(count - 1);
+    QCOMPARE(m_dm->getActiveSample(), count - 1);
+    m_dm->setActiveSample(count);
+    QCOMPARE(m_dm->getActiveSample(), NO_INDEX);
+    m_dm->setActiveSample(AVERAGED_SAMPLE_INDEX);
+    QCOMPARE(m_dm->getActiveSample(), AVERAGED_SAMPLE_INDEX);
+    m_dm->setActiveJob(NO_INDEX);
+}
+
+void TestDataManager::listIsSortedByCompletionLatestFirst()
+{
+    onDataManagerThread([this] { return m_dm->refreshJobInfos(); });
+    const QVector<Job> jobs = m_dm->getAllJobs();
+    QCOMPARE(jobs.first().getName(), m_staged);
+    for (int i = 1; i < jobs.size(); ++i)
+        QVERIFY(jobs[i - 1].getDateComplete() >= jobs[i].getDateComplete());
+    // Jobs without measurements carry the epoch and come last.
+    QCOMPARE(jobs.last().getNumSamples(), 0);
+    QCOMPARE(jobs.last().getDateComplete().toSecsSinceEpoch(), 0);
+}
 
 void TestDataManager::deletingAllSamplesGoesFromTheHighestNumberDown()
 {
