@@ -1,6 +1,7 @@
 #include "AppShell.h"
 
 #include "Communication/CmdData.h"
+#include "Screens/PopupPanel.h"
 #include "SharedSystem/Instrument.h"
 #include "SharedSystem/Sample.h"
 #include "SharedSystem/InstrumentTypes.h"
@@ -68,6 +69,7 @@ void registerMetaTypes()
     qRegisterMetaType<Sample>("Sample");
     qRegisterMetaType<SOUNDS>("SOUNDS");
     qRegisterMetaType<TEST>("TEST");
+    qRegisterMetaType<PopupPanel*>("PopupPanel*");
     qRegisterMetaType<NETWORK_DESCRIPTION_T>("NETWORK_DESCRIPTION_T");
 }
 

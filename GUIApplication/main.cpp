@@ -4,9 +4,9 @@
 #include "SharedSystem/StringTables.h"
 #include "Utils/AudioPlayer.h"
 #include "MyApplication.h"
+#include "Screens/ScreenMaster.h"
 
 #include <QDebug>
-#include <QLabel>
 #include <QTextCodec>
 #include <QThread>
 
@@ -49,10 +49,8 @@ int main(int argc, char* argv[])
     qDebug() << QString("Main/GUI Thread is Running: %1")
                     .arg(reinterpret_cast<quintptr>(QThread::currentThreadId()));
 
-    // 10: the screen stack replaces this window once it exists.
-    QLabel screen("MarigoldGUIApp");
-    screen.setAlignment(Qt::AlignCenter);
-    screen.resize(320, 480);
+    // 10
+    ScreenMaster screen;
     screen.showFullScreen();
 
     // 11

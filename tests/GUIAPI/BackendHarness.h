@@ -199,19 +199,26 @@ private:
 class RecordingProxy
 {
 public:
-    explicit RecordingProxy(quint16 serverPort) : m_serverPort(serverPort)
+    explicit RecordingProxy(quint16 serverPort)
+        : m_serverPort(serverPort)
+        , m_peer(std::make_unique<ScriptedPeer>())
     {
-        m_peer.setResponder([this](const QByteArray& frame) {
+        m_peer->setResponder([this](const QByteArray& frame) {
             ScriptedPeer::Reply reply;
             reply.chunks << forward(frame);
             return reply;
         });
     }
-    ~RecordingProxy() { closeServerSide(); }
+    ~RecordingProxy()
+    {
+        // The relay's thread first: it may be inside forward().
+        m_peer.reset();
+        closeServerSide();
+    }
 
-    bool listen(quint16 port = 0) { return m_peer.listen(port); }
-    quint16 port() const { return m_peer.port(); }
-    void dropConnections() { m_peer.dropConnections(); }
+    bool listen(quint16 port = 0) { return m_peer->listen(port); }
+    quint16 port() const { return m_peer->port(); }
+    void dropConnections() { m_peer->dropConnections(); }
 
     // Command codes received so far, oldest first.
     // Answers frames locally: a non-empty result is sent back instead of
@@ -233,7 +240,7 @@ public:
     QList<quint32> codes() const
     {
         QList<quint32> out;
-        for (const QByteArray& frame : m_peer.receivedFrames()) {
+        for (const QByteArray& frame : m_peer->receivedFrames()) {
             CmdData packet;
             try {
                 packet.setFullData(frame);
@@ -244,7 +251,7 @@ public:
         }
         return out;
     }
-    int frameCount() const { return m_peer.receivedFrames().size(); }
+    int frameCount() const { return m_peer->receivedFrames().size(); }
 
 private:
     // Runs on the peer's thread: one frame to the simulator, its reply back.
@@ -351,7 +358,7 @@ private:
     std::mutex m_interceptorMutex;
     std::function<QByteArray(const CmdData&, const QByteArray&)> m_interceptor;
     std::function<void(const CmdData&, QByteArray&)> m_replyFilter;
-    ScriptedPeer m_peer;
+    std::unique_ptr<ScriptedPeer> m_peer;
 };
 
 // The simulator on its own thread with a fresh data folder (the demo set).
