@@ -8,12 +8,31 @@
 #include "Widgets/Theme.h"
 
 #include <QEvent>
+#include <QPainter>
+#include <QPixmap>
 #include <QStringList>
+#include <qdrawutil.h>
 
 namespace {
+
 // A second touch while the first one's action runs must not act twice.
 const int kButtonDebounceMs = 5000;
+
+// The card of this popup changes its height with the job: the product's
+// card picture, its rounded corners kept and its sides stretched.
+QPixmap cardOfSize(const QSize& size)
+{
+    QPixmap card(size);
+    card.fill(Qt::transparent);
+    QPainter painter(&card);
+    painter.setRenderHint(QPainter::SmoothPixmapTransform);
+    const QMargins corners(14, 14, 14, 14);
+    qDrawBorderPixmap(&painter, card.rect(), corners,
+                      QPixmap(QStringLiteral(":/Assets/modal_overlay_inset_440.png")));
+    return card;
 }
+
+} // namespace
 
 JobActionsPopup::JobActionsPopup(QWidget* parent)
     : PopupPanel(parent)
@@ -32,6 +51,7 @@ JobActionsPopup::JobActionsPopup(QWidget* parent)
     Theme::styleButton(ui->BtnDelete, Theme::DestructiveButton);
     ui->BtnSync->hide();
     fillFromActiveJob();
+    ui->labelPopupBackGround->setPixmap(cardOfSize(ui->labelPopupBackGround->size()));
 }
 
 JobActionsPopup::~JobActionsPopup()

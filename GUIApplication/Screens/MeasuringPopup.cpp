@@ -141,55 +141,42 @@ void MeasuringPopup::applyBrandingImage(const QString& brandingImage)
 
 void MeasuringPopup::setState(MEASURING_POPUP_STATE_T state)
 {
-    ProgressBarCircle* circle = ui->progressBarCircle;
-    switch (state) {
-    case STATE_POPUP_INIT:
-        m_propertyAnimation.stop();
-        circle->setValue(0);
-        ui->labelCheckMark->hide();
-        ui->labelBracket->hide();
-        ui->labelSubText->hide();
-        ui->labelWarningSubText->hide();
-        ui->labelTimerSubtext->hide();
-        circle->setForegroundImage(QStringLiteral(":/Assets/measuring_red_circle.png"));
-        ui->icnPopupBkgnd->setPixmap(QPixmap(QStringLiteral(":/Assets/overlay_background_meas.png")));
-        break;
-    case STATE_POPUP_MEASURING:
-        m_propertyAnimation.stop();
-        circle->setValue(0);
-        ui->labelText->setText(tr("Measuring"));
-        ui->labelSubText->setText(tr("Hold Steady"));
-        ui->labelBracket->show();
-        ui->labelSubText->show();
-        ui->labelCheckMark->hide();
-        ui->labelWarningSubText->hide();
-        ui->labelTimerSubtext->hide();
-        circle->setForegroundImage(QStringLiteral(":/Assets/measuring_red_circle.png"));
-        ui->icnPopupBkgnd->setPixmap(QPixmap(QStringLiteral(":/Assets/overlay_background_meas.png")));
-        break;
-    case STATE_POPUP_CALCULATING:
-        m_propertyAnimation.stop();
-        circle->setValue(0);
-        ui->labelText->setText(tr("Calculating"));
-        ui->labelBracket->show();
-        ui->labelSubText->show();
-        ui->labelSubText->setText(tr("OK to move instrument"));
-        ui->labelCheckMark->hide();
-        ui->labelWarningSubText->hide();
-        ui->labelTimerSubtext->hide();
-        // The green sweep fills over a full red ring.
-        circle->setBackgroundImage(QStringLiteral(":/Assets/measuring_red_circle.png"));
-        circle->setForegroundImage(QStringLiteral(":/Assets/measuring_green_circle.png"));
-        ui->icnPopupBkgnd->setPixmap(QPixmap(QStringLiteral(":/Assets/overlay_background_calc.png")));
-        break;
-    case STATE_POPUP_COMPLETE:
+    if (state == STATE_POPUP_COMPLETE) {
         ui->icnPopupBkgnd->setPixmap(QPixmap(QStringLiteral(":/Assets/overlay_background_calc.png")));
         // The owner deletes the popup inside this call: nothing may follow.
         onCloseTimeout();
         return;
-    default:
-        break;
     }
+    if (state != STATE_POPUP_INIT && state != STATE_POPUP_MEASURING && state != STATE_POPUP_CALCULATING)
+        return;
+
+    const bool calculating = state == STATE_POPUP_CALCULATING;
+    ProgressBarCircle* circle = ui->progressBarCircle;
+    m_propertyAnimation.stop();
+    circle->setValue(0);
+    if (state == STATE_POPUP_MEASURING) {
+        ui->labelText->setText(tr("Measuring"));
+        ui->labelSubText->setText(tr("Hold Steady"));
+    } else if (calculating) {
+        ui->labelText->setText(tr("Calculating"));
+        ui->labelSubText->setText(tr("OK to move instrument"));
+    }
+    // "Hold steady" stands while the instrument works, not before.
+    const bool holdSteady = state != STATE_POPUP_INIT;
+    ui->labelBracket->setVisible(holdSteady);
+    ui->labelSubText->setVisible(holdSteady);
+    ui->labelCheckMark->hide();
+    ui->labelWarningSubText->hide();
+    ui->labelTimerSubtext->hide();
+    if (calculating) {
+        // The green sweep fills over a full red ring.
+        circle->setBackgroundImage(QStringLiteral(":/Assets/measuring_red_circle.png"));
+        circle->setForegroundImage(QStringLiteral(":/Assets/measuring_green_circle.png"));
+    } else {
+        circle->setForegroundImage(QStringLiteral(":/Assets/measuring_red_circle.png"));
+    }
+    ui->icnPopupBkgnd->setPixmap(QPixmap(calculating ? QStringLiteral(":/Assets/overlay_background_calc.png")
+                                                     : QStringLiteral(":/Assets/overlay_background_meas.png")));
 }
 
 void MeasuringPopup::setText(QString text)

@@ -3,9 +3,34 @@
 #include <QMouseEvent>
 #include <QResizeEvent>
 
+#include <cstdlib>
+
 namespace {
+
 const unsigned int kBadPageIndex = 2; // STATUS_BAD_RESPONSE_STATUS
+
+int along(const QPoint& point, Qt::Orientation direction)
+{
+    return direction == Qt::Horizontal ? point.x() : point.y();
 }
+
+int across(const QPoint& point, Qt::Orientation direction)
+{
+    return direction == Qt::Horizontal ? point.y() : point.x();
+}
+
+// Left or top edge, and right or bottom edge (QRect's last pixel).
+int nearEdge(const QRect& rect, Qt::Orientation direction)
+{
+    return direction == Qt::Horizontal ? rect.left() : rect.top();
+}
+
+int farEdge(const QRect& rect, Qt::Orientation direction)
+{
+    return direction == Qt::Horizontal ? rect.right() : rect.bottom();
+}
+
+} // namespace
 
 PageContainer::PageContainer(QWidget* parent)
     : MarigoldPanel(parent)
@@ -152,6 +177,65 @@ void PageContainer::mousePressEvent(QMouseEvent* event)
     m_previousMousePosition = event->pos();
     // Left unaccepted: a scroll area on the page may want the gesture.
     QWidget::mousePressEvent(event);
+}
+
+void PageContainer::moveGesture(QMouseEvent* event, Qt::Orientation direction)
+{
+    int d = along(event->pos(), direction) - along(m_previousMousePosition, direction);
+    const int other = across(event->pos(), direction) - across(m_previousMousePosition, direction);
+
+    // The gesture is taken once it runs mainly along the direction and far
+    // enough; until then nothing moves, and a scroll area on the page may
+    // have the events.
+    if (std::abs(d) > std::abs(other) && std::abs(d) >= m_minSlideDistance && !m_firstDirection) {
+        m_hasFocus = true;
+        m_firstDirection = true;
+    }
+
+    if (m_mousePressed && !m_widgetList.empty() && m_hasFocus) {
+        const int margin = direction == Qt::Horizontal ? (width() - m_widgetList.front()->width()) / 2 : 0;
+        const QRect container = geometry();
+        const QRect view = m_viewport->geometry();
+        const int viewNear = nearEdge(view, direction) - margin;
+        const int viewFar = farEdge(view, direction) - margin;
+        if (viewFar + d > farEdge(container, direction) && viewNear + d < nearEdge(container, direction)) {
+            slidePages(d);
+            m_previousMousePosition = event->pos();
+        } else if (viewFar + d < farEdge(container, direction)) {
+            // Past the last page: the far edges meet.
+            slidePages(farEdge(container, direction) - farEdge(view, direction) - 1 - margin);
+        } else if (viewNear + d > nearEdge(container, direction)) {
+            // Before the first page: the near edges meet.
+            slidePages(nearEdge(container, direction) - nearEdge(view, direction) + margin);
+        }
+    }
+
+    if (!m_hasFocus)
+        QWidget::mouseMoveEvent(event);
+}
+
+void PageContainer::releaseGesture(QMouseEvent* event, Qt::Orientation direction)
+{
+    // With no pages there is nothing to snap to: the gesture just ends.
+    const bool snap = m_hasFocus && !m_widgetList.empty();
+    int target = m_currentPage;
+    if (snap) {
+        // A page dragged by more than half its size gives way to its neighbour.
+        const QRect page = translateGeometry(pageAt(m_currentPage)->geometry());
+        const int centre = along(page.center(), direction);
+        const QRect container = geometry();
+        if (centre < nearEdge(container, direction))
+            target = m_currentPage + 1;
+        else if (centre > farEdge(container, direction))
+            target = m_currentPage - 1;
+    }
+    m_mousePressed = false;
+    m_hasFocus = false;
+    m_firstDirection = false;
+    QWidget::mouseReleaseEvent(event);
+    // Last, so that an index past the end throws with the gesture ended.
+    if (snap)
+        onSelectPage(target);
 }
 
 void PageContainer::resizeEvent(QResizeEvent* event)

@@ -55,6 +55,12 @@ protected:
     void mousePressEvent(QMouseEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
 
+    // The gesture, written once for both directions: the horizontal
+    // container reads x and centres pages narrower than itself, the
+    // vertical one reads y.
+    void moveGesture(QMouseEvent* event, Qt::Orientation direction);
+    void releaseGesture(QMouseEvent* event, Qt::Orientation direction);
+
     // Throws 2 unless 0 <= index < count (or <= count when allowEnd).
     void checkIndex(int index, bool allowEnd = false) const;
     QWidget* pageAt(int index) const;

@@ -20,7 +20,7 @@ class QsKineticScroller : public QObject
 public:
     static const int gMaxIgnoredMouseMoves = 2;
     static const int gTimerInterval = 5;
-    static const int gMaxDecelerationSpeed = 30;
+    static constexpr int gMaxDecelerationSpeed = 30;
     static const int gFriction = 1;
 
     explicit QsKineticScroller(QObject* parent = nullptr, Qt::Orientation orientation = Qt::Vertical);

@@ -201,7 +201,17 @@ void tst_MeasuringPopup::statesFollowTheInstrument()
     popup.onUpdateSystemState(STATE_MEASURING);
     popup.onUpdateSystemState(STATE_CALIBRATING);
     QCOMPARE(labelOf(popup, "labelText")->text(), QStringLiteral("Measuring"));
+    QCOMPARE(labelOf(popup, "labelSubText")->text(), QStringLiteral("Hold Steady"));
     QCOMPARE(closed.count(), 0);
+
+    // Before the instrument starts: no "hold steady", the title as it was.
+    popup.onUpdatePercentComplete(100);
+    popup.setState(STATE_POPUP_INIT);
+    QCOMPARE(circle->value(), 0);
+    QVERIFY(labelOf(popup, "labelSubText")->isHidden());
+    QVERIFY(labelOf(popup, "labelBracket")->isHidden());
+    QCOMPARE(labelOf(popup, "labelText")->text(), QStringLiteral("Measuring"));
+    QCOMPARE(circle->foregroundImage(), QStringLiteral(":/Assets/measuring_red_circle.png"));
 }
 
 void tst_MeasuringPopup::averagingStateChangesNothing()

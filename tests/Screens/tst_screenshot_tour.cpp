@@ -10,11 +10,14 @@
 // measurement issue the way the top panel does. A third field names a
 // language to take the screen in ("de", "fr", "es").
 
+#include "Communication/Commands.h"
+#include "Communication/TcpClient.h"
 #include "GUIAPI/DataManager.h"
 #include "Screens/DaddyPanel.h"
 #include "Screens/DeletePopup.h"
 #include "Screens/ErrorPopup.h"
 #include "Screens/JobActionsPopup.h"
+#include "Screens/JobListScreen.h"
 #include "Screens/LockScreen.h"
 #include "Screens/MeasuringPopup.h"
 #include "Screens/NotificationPopup.h"
@@ -25,11 +28,15 @@
 #include "Screens/SyncScreen.h"
 #include "Screens/TerminateJobPopup.h"
 #include "Screens/UndoPopup.h"
+#include "SharedSystem/Instrument.h"
+#include "SharedSystem/Job.h"
 #include "SharedSystem/LocaleHelper.h"
+#include "SharedSystem/UserParams.h"
 #include "Widgets/FlickButton.h"
 #include "Widgets/FlickList.h"
 #include "Widgets/KLabel.h"
 #include "Widgets/ListingHeader.h"
+#include "Widgets/ProgressBarCircle.h"
 #include "Widgets/StatusBar.h"
 #include "Widgets/Theme.h"
 
@@ -38,6 +45,9 @@
 #include <QLabel>
 #include <QTranslator>
 #include <QtTest>
+
+#include "SimServer.h"
+#include "support/TestSupport.h"
 
 #include <functional>
 
@@ -212,10 +222,98 @@ void statusBarStates(QWidget* display)
 
 } // namespace Tour
 
+// ---- The home screen with the simulator's demo jobs ---------------------------
+
+namespace HomeTour {
+
+// The job list shows what a server holds: the simulator's demo set, read
+// once. The status poll is not started, so the status bars of the other
+// stops keep the states they are drawn with.
+bool loadDemoJobs()
+{
+    static const bool loaded = [] {
+        static Sim::ServerThread sim;
+        sim.options().port = TestSupport::freeLocalPort();
+        sim.options().controlPort = -1;
+        sim.options().instrument.dataDir = TestSupport::makeTempDir("tour-sim");
+        sim.options().instrument.seed = 7;
+        if (!sim.start())
+            return false;
+        setIpAddress("127.0.0.1");
+        setIpPort(sim.port());
+        Commands::Init();
+        Commands::instance()->tcpClient()->connectToHost();
+        DataManager* data = DataManager::instance();
+        data->onSync();
+        data->setSystemStatus(Tour::workshopStatus());
+        data->updateJobInfos();
+        return data->getNumberOfJobs() > 0;
+    }();
+    return loaded;
+}
+
+// The first job of the list that is (or is not) complete becomes the active one.
+void activateJob(bool complete)
+{
+    const QVector<Job> jobs = DataManager::instance()->getAllJobs();
+    for (int i = 0; i < jobs.size(); ++i) {
+        if (jobs[i].isJobComplete() == complete) {
+            DataManager::instance()->setActiveJob(i);
+            return;
+        }
+    }
+}
+
+JobListScreen* home(QWidget* display, bool completeTab)
+{
+    loadDemoJobs();
+    UserParams::setAllowSync(true);
+    auto* screen = new JobListScreen(display);
+    screen->SetActiveStatus(true);
+    screen->onInit();
+    screen->stateChanged(completeTab);
+    if (auto* bar = screen->findChild<StatusBar*>())
+        bar->onSystemStatusUpdated(Tour::workshopStatus());
+    return screen;
+}
+
+MeasuringPopup* measuring(QWidget* display, const QString& branding = QString())
+{
+    Tour::jobListBackdrop(display);
+    auto* popup = new MeasuringPopup(branding, display);
+    popup->raise();
+    popup->show();
+    return popup;
+}
+
+void progress(MeasuringPopup* popup, int percent)
+{
+    popup->findChild<ProgressBarCircle*>("progressBarCircle")->setValue(percent);
+}
+
+} // namespace HomeTour
+
 // ---- The tour: one line per screen ---------------------------------------------
 
 static const QList<Tour::Stop> kTour = {
     {"home_backdrop", [](QWidget* d) { Tour::jobListBackdrop(d); }},
+    {"home_jobs_open", [](QWidget* d) { HomeTour::home(d, false); }},
+    {"home_jobs_complete", [](QWidget* d) { HomeTour::home(d, true); }},
+    {"home_job_actions_open", [](QWidget* d) {
+         HomeTour::activateJob(false);
+         HomeTour::home(d, false)->onShowJobActionsPopup();
+     }},
+    {"home_job_actions_complete", [](QWidget* d) {
+         HomeTour::activateJob(true);
+         HomeTour::home(d, true)->onShowJobActionsPopup();
+     }},
+    {"home_delete_job", [](QWidget* d) {
+         HomeTour::activateJob(true);
+         HomeTour::home(d, true)->onShowDeleteJobsPopup();
+     }},
+    {"home_delete_completed_jobs", [](QWidget* d) { HomeTour::home(d, true)->onShowDeleteCompletedJobsPopup(); }},
+    {"home_jobs_full", [](QWidget* d) { HomeTour::home(d, false)->onShowJobsFullPopup(); }},
+    {"home_measures_full", [](QWidget* d) { HomeTour::home(d, false)->onShowMeasuresFullPopup(); }},
     {"status_bar_states", [](QWidget* d) { Tour::statusBarStates(d); }},
     {"popup_message_box", [](QWidget* d) {
          Tour::jobListBackdrop(d)->onShowMessageBoxPopup(
@@ -238,8 +336,16 @@ static const QList<Tour::Stop> kTour = {
          p->setConfirmButtonText("Edit");
          p->setCancelButtonText("Cancel");
      }},
-    {"popup_job_actions", [](QWidget* d) { Tour::over<JobActionsPopup>(d); }},
-    {"popup_measuring", [](QWidget* d) { Tour::over<MeasuringPopup>(d)->onUpdatePercentComplete(60); }},
+    {"popup_measuring", [](QWidget* d) { HomeTour::progress(HomeTour::measuring(d), 62); }},
+    {"popup_measuring_calculating", [](QWidget* d) {
+         MeasuringPopup* p = HomeTour::measuring(d);
+         p->onUpdateSystemState(STATE_CALCULATING);
+         HomeTour::progress(p, 35);
+     }},
+    {"popup_measuring_branded", [](QWidget* d) {
+         UserParams::setMeasuringCircleID("colour_wheel.svg");
+         HomeTour::progress(HomeTour::measuring(d, UserParams::getMeasuringCircleID()), 70);
+     }},
     {"popup_terminate_job", [](QWidget* d) { Tour::over<TerminateJobPopup>(d); }},
     {"popup_terminate_job_es", [](QWidget* d) { Tour::over<TerminateJobPopup>(d); }, "es"},
     {"popup_power_down", [](QWidget* d) { Tour::over<PowerDownPopup>(d); }},
