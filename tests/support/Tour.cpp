@@ -17,8 +17,13 @@
 
 #include <QApplication>
 #include <QDir>
+#include <QRegularExpression>
 #include <QLabel>
+#include <QAbstractButton>
+#include <QGlyphRun>
 #include <QSet>
+#include <QTextDocument>
+#include <QTextLayout>
 #include <QTranslator>
 #include <QtTest>
 
@@ -199,23 +204,115 @@ void Runner::initTestCase()
     DataManager::instance();
 }
 
+QStringList productLanguages()
+{
+    return {"en", "es", "fr", "de", "it", "pt", "ja", "ko", "zh_Hans"};
+}
+
+namespace {
+
+// A glyph index of 0 is the font's "missing character" box, also after
+// font fallback has had its say.
+bool hasMissingGlyphs(const QString& text, const QFont& font)
+{
+    QTextLayout layout(text, font);
+    layout.beginLayout();
+    while (layout.createLine().isValid()) {
+    }
+    layout.endLayout();
+    for (const QGlyphRun& run : layout.glyphRuns()) {
+        if (run.glyphIndexes().contains(0))
+            return true;
+    }
+    return false;
+}
+
+QString plain(QString text)
+{
+    return text.remove(QRegularExpression("<[^>]*>")).replace("&nbsp;", " ");
+}
+
+QString describe(QWidget* w, const QString& text)
+{
+    const QString name = w->objectName().isEmpty() ? QString(w->metaObject()->className()) : w->objectName();
+    return QString("%1 \"%2\"").arg(name, text.left(50));
+}
+
+} // namespace
+
+QStringList textFaults(QWidget* root)
+{
+    QStringList faults;
+    for (QLabel* label : root->findChildren<QLabel*>()) {
+        if (!label->isVisibleTo(root) || label->text().trimmed().isEmpty() || label->width() <= 1)
+            continue;
+        const QString text = Qt::mightBeRichText(label->text()) ? plain(label->text()) : label->text();
+        const QFontMetrics metrics(label->font());
+        const QRect box = label->contentsRect().adjusted(label->margin(), label->margin(), -label->margin(),
+                                                         -label->margin());
+        if (hasMissingGlyphs(text, label->font()))
+            faults << "missing characters in " + describe(label, text);
+        if (label->wordWrap()) {
+            const QRect needed = metrics.boundingRect(box, int(label->alignment()) | Qt::TextWordWrap, text);
+            if (needed.height() > box.height() + 2 || needed.width() > box.width() + 2)
+                faults << "cut " + describe(label, text);
+        } else {
+            for (const QString& line : text.split('\n')) {
+                if (metrics.horizontalAdvance(line) > box.width() + 2) {
+                    faults << "runs out of its box " + describe(label, line);
+                    break;
+                }
+            }
+        }
+    }
+    for (QAbstractButton* button : root->findChildren<QAbstractButton*>()) {
+        if (!button->isVisibleTo(root) || button->text().trimmed().isEmpty())
+            continue;
+        if (hasMissingGlyphs(button->text(), button->font()))
+            faults << "missing characters in " + describe(button, button->text());
+        const QFontMetrics metrics(button->font());
+        for (const QString& line : button->text().split('\n')) {
+            if (metrics.horizontalAdvance(line) > button->width()) {
+                faults << "runs out of its button " + describe(button, line);
+                break;
+            }
+        }
+    }
+    return faults;
+}
+
 void Runner::tour_data()
 {
     QTest::addColumn<int>("stop");
+    QTest::addColumn<QString>("language");
     for (int i = 0; i < m_stops.size(); ++i)
-        QTest::newRow(qPrintable(m_stops.at(i).name)) << i;
+        QTest::newRow(qPrintable(m_stops.at(i).name)) << i << m_stops.at(i).language;
+
+    QStringList languages = qEnvironmentVariable("MARIGOLD_TOUR_LANGUAGES").split(',', Qt::SkipEmptyParts);
+    if (languages == QStringList{"all"})
+        languages = productLanguages();
+    for (const QString& code : languages) {
+        if (code == "en")
+            continue;
+        for (int i = 0; i < m_stops.size(); ++i) {
+            if (m_stops.at(i).language.isEmpty())
+                QTest::newRow(qPrintable(m_stops.at(i).name + "_" + code)) << i << code;
+        }
+    }
 }
 
 void Runner::tour()
 {
     QFETCH(int, stop);
+    QFETCH(QString, language);
     const Stop& s = m_stops.at(stop);
+    const QString shotName = language == s.language ? s.name : s.name + "_" + language;
 
     QTranslator translator;
-    if (!s.language.isEmpty()) {
-        QVERIFY(translator.load(ScreenMaster::languageFilePath(s.language)));
+    if (!language.isEmpty()) {
+        QVERIFY(translator.load(ScreenMaster::languageFilePath(language)));
         QApplication::installTranslator(&translator);
-        QApplication::setFont(LocaleHelper::determineFontFromCountryCode(s.language));
+        QApplication::setFont(LocaleHelper::determineFontFromCountryCode(language));
     }
 
     QWidget window;
@@ -237,15 +334,22 @@ void Runner::tour()
     for (int y = 0; y < shot.height(); y += 7)
         for (int x = 0; x < shot.width(); x += 7)
             colours.insert(shot.pixel(x, y));
-    QVERIFY2(colours.size() > 4, qPrintable(s.name));
+    QVERIFY2(colours.size() > 4, qPrintable(shotName));
 
-    const QString file = m_directory + "/" + s.name + ".png";
+    const QString file = m_directory + "/" + shotName + ".png";
     QVERIFY2(shot.save(file, "PNG"), qPrintable(file));
 
-    if (!s.language.isEmpty()) {
+    const QStringList faults = textFaults(&window);
+    const bool strict = !qEnvironmentVariableIsEmpty("MARIGOLD_TOUR_STRICT");
+    for (const QString& fault : faults)
+        qWarning().noquote() << shotName << ":" << fault;
+
+    if (!language.isEmpty()) {
         QApplication::removeTranslator(&translator);
         QApplication::setFont(LocaleHelper::determineFontFromCountryCode("en"));
     }
+    if (strict)
+        QVERIFY2(faults.isEmpty(), qPrintable(faults.join('\n')));
 }
 
 int run(const QList<Stop>& stops, int argc, char** argv)

@@ -24,6 +24,11 @@
 // puts a popup over the job list backdrop; Tour::issue(d, code) raises a
 // measurement issue the way the top panel does. A third field names a
 // language to take the screen in.
+//
+// Every shot is also read for text that does not fit its box or that is
+// drawn as missing-character boxes; the faults are logged, and fail the
+// stop when MARIGOLD_TOUR_STRICT is set. MARIGOLD_TOUR_LANGUAGES (codes
+// joined by commas, or "all") takes every stop again in those languages.
 
 #include "SharedSystem/SystemStatus.h"
 
@@ -100,6 +105,13 @@ private:
 };
 
 int run(const QList<Stop>& stops, int argc, char** argv);
+
+// Texts of the visible labels and buttons under `root` that are cut, run
+// out of their box, or have characters no installed font can draw.
+QStringList textFaults(QWidget* root);
+
+// The nine languages of the product, by the codes of their translation files.
+QStringList productLanguages();
 
 } // namespace Tour
 
