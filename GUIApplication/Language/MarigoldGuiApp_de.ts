@@ -160,10 +160,126 @@
     </message>
 </context>
 <context>
+    <name>JobActionsPopup</name>
+    <message>
+        <source>Delete Job</source>
+        <translation>Auftrag löschen</translation>
+    </message>
+    <message>
+        <source>View/Edit Job</source>
+        <translation>Auftrag ansehen/bearbeiten</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Abbrechen</translation>
+    </message>
+    <message>
+        <source>Copy Job</source>
+        <translation>Auftrag kopieren</translation>
+    </message>
+    <message>
+        <source>Send Job To Server</source>
+        <translation>Auftrag an Server senden</translation>
+    </message>
+    <message>
+        <source>Execute Job</source>
+        <translation>Auftrag ausführen</translation>
+    </message>
+</context>
+<context>
+    <name>JobListQuickSelectionItem</name>
+    <message>
+        <source>Delete All Completed Jobs</source>
+        <translation>Alle abgeschlossenen Aufträge löschen</translation>
+    </message>
+</context>
+<context>
+    <name>JobListScreen</name>
+    <message>
+        <source>Jobs</source>
+        <translation>Aufträge</translation>
+    </message>
+    <message>
+        <source>+</source>
+        <translation>+</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Offen</translation>
+    </message>
+    <message>
+        <source>Complete</source>
+        <translation>Fertig</translation>
+    </message>
+    <message>
+        <source>Open (%1)</source>
+        <translation>Offen (%1)</translation>
+    </message>
+    <message>
+        <source>Complete (%1)</source>
+        <translation>Fertig (%1)</translation>
+    </message>
+    <message>
+        <source>Delete Job?</source>
+        <translation>Auftrag löschen?</translation>
+    </message>
+    <message>
+        <source>The entire job and all samples will be permanently deleted.</source>
+        <translation>Der gesamte Auftrag und alle Proben werden endgültig gelöscht.</translation>
+    </message>
+    <message>
+        <source>Delete All Completed Jobs?</source>
+        <translation>Alle abgeschlossenen Aufträge löschen?</translation>
+    </message>
+    <message>
+        <source>All completed jobs will be permanently deleted.</source>
+        <translation>Alle abgeschlossenen Aufträge werden endgültig gelöscht.</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+    <message>
+        <source>Instrument Is Full</source>
+        <translation>Gerätespeicher voll</translation>
+    </message>
+    <message>
+        <source>A new job cannot be created until one or more existing jobs are removed from the instrument.</source>
+        <translation>Ein neuer Auftrag kann erst angelegt werden, wenn vorhandene Aufträge vom Gerät gelöscht wurden.</translation>
+    </message>
+    <message>
+        <source>There is not enough memory to complete the requested Job. Please remove existing jobs to free up memory.</source>
+        <translation>Der Speicher reicht für diesen Auftrag nicht aus. Bitte löschen Sie vorhandene Aufträge, um Speicher freizugeben.</translation>
+    </message>
+</context>
+<context>
     <name>LockScreen</name>
     <message>
         <source>Instrument Locked</source>
         <translation>Gerät gesperrt</translation>
+    </message>
+</context>
+<context>
+    <name>MeasuringPopup</name>
+    <message>
+        <source>Measuring</source>
+        <translation>Messung läuft</translation>
+    </message>
+    <message>
+        <source>Hold Steady</source>
+        <translation>Ruhig halten</translation>
+    </message>
+    <message>
+        <source>Do not touch or bump instrument</source>
+        <translation>Gerät nicht berühren oder anstoßen</translation>
+    </message>
+    <message>
+        <source>Calculating</source>
+        <translation>Berechnung läuft</translation>
+    </message>
+    <message>
+        <source>OK to move instrument</source>
+        <translation>Gerät darf bewegt werden</translation>
     </message>
 </context>
 <context>
@@ -197,6 +313,237 @@
     </message>
 </context>
 <context>
+    <name>StringTables</name>
+    <message>
+        <source>English</source>
+        <translation>Englisch</translation>
+    </message>
+    <message>
+        <source>Spanish</source>
+        <translation>Spanisch</translation>
+    </message>
+    <message>
+        <source>French</source>
+        <translation>Französisch</translation>
+    </message>
+    <message>
+        <source>German</source>
+        <translation>Deutsch</translation>
+    </message>
+    <message>
+        <source>Italian</source>
+        <translation>Italienisch</translation>
+    </message>
+    <message>
+        <source>Portuguese</source>
+        <translation>Portugiesisch</translation>
+    </message>
+    <message>
+        <source>Japanese</source>
+        <translation>Japanisch</translation>
+    </message>
+    <message>
+        <source>Korean</source>
+        <translation>Koreanisch</translation>
+    </message>
+    <message>
+        <source>Chinese Simplified</source>
+        <translation>Chinesisch (vereinfacht)</translation>
+    </message>
+    <message>
+        <source>Custom</source>
+        <translation>Benutzerdefiniert</translation>
+    </message>
+    <message>
+        <source>-45%1</source>
+        <translation>-45%1</translation>
+    </message>
+    <message>
+        <source>-15%1</source>
+        <translation>-15%1</translation>
+    </message>
+    <message>
+        <source>15%1</source>
+        <translation>15%1</translation>
+    </message>
+    <message>
+        <source>45%1</source>
+        <translation>45%1</translation>
+    </message>
+    <message>
+        <source>80%1</source>
+        <translation>80%1</translation>
+    </message>
+    <message>
+        <source>Diffuse</source>
+        <translation>Diffus</translation>
+    </message>
+    <message>
+        <source>25%1</source>
+        <translation>25%1</translation>
+    </message>
+    <message>
+        <source>75%1</source>
+        <translation>75%1</translation>
+    </message>
+    <message>
+        <source>110%1</source>
+        <translation>110%1</translation>
+    </message>
+    <message>
+        <source>A/2%1</source>
+        <translation>A/2%1</translation>
+    </message>
+    <message>
+        <source>A/10%1</source>
+        <translation>A/10%1</translation>
+    </message>
+    <message>
+        <source>C/2%1</source>
+        <translation>C/2%1</translation>
+    </message>
+    <message>
+        <source>C/10%1</source>
+        <translation>C/10%1</translation>
+    </message>
+    <message>
+        <source>D50/2%1</source>
+        <translation>D50/2%1</translation>
+    </message>
+    <message>
+        <source>D50/10%1</source>
+        <translation>D50/10%1</translation>
+    </message>
+    <message>
+        <source>D55/2%1</source>
+        <translation>D55/2%1</translation>
+    </message>
+    <message>
+        <source>D55/10%1</source>
+        <translation>D55/10%1</translation>
+    </message>
+    <message>
+        <source>D65/2%1</source>
+        <translation>D65/2%1</translation>
+    </message>
+    <message>
+        <source>D65/10%1</source>
+        <translation>D65/10%1</translation>
+    </message>
+    <message>
+        <source>D75/2%1</source>
+        <translation>D75/2%1</translation>
+    </message>
+    <message>
+        <source>D75/10%1</source>
+        <translation>D75/10%1</translation>
+    </message>
+    <message>
+        <source>F2/2%1</source>
+        <translation>F2/2%1</translation>
+    </message>
+    <message>
+        <source>F2/10%1</source>
+        <translation>F2/10%1</translation>
+    </message>
+    <message>
+        <source>F7/2%1</source>
+        <translation>F7/2%1</translation>
+    </message>
+    <message>
+        <source>F7/10%1</source>
+        <translation>F7/10%1</translation>
+    </message>
+    <message>
+        <source>F8/2%1</source>
+        <translation>F8/2%1</translation>
+    </message>
+    <message>
+        <source>F8/10%1</source>
+        <translation>F8/10%1</translation>
+    </message>
+    <message>
+        <source>F10/2%1</source>
+        <translation>F10/2%1</translation>
+    </message>
+    <message>
+        <source>F10/10%1</source>
+        <translation>F10/10%1</translation>
+    </message>
+    <message>
+        <source>F11/2%1</source>
+        <translation>F11/2%1</translation>
+    </message>
+    <message>
+        <source>F11/10%1</source>
+        <translation>F11/10%1</translation>
+    </message>
+    <message>
+        <source>F12/2%1</source>
+        <translation>F12/2%1</translation>
+    </message>
+    <message>
+        <source>F12/10%1</source>
+        <translation>F12/10%1</translation>
+    </message>
+    <message>
+        <source>Mid Tier</source>
+        <translation>Mittelklasse</translation>
+    </message>
+    <message>
+        <source>ALDER</source>
+        <translation>ALDER</translation>
+    </message>
+    <message>
+        <source>BIRCH</source>
+        <translation>BIRCH</translation>
+    </message>
+    <message>
+        <source>QC</source>
+        <translation>QC</translation>
+    </message>
+    <message>
+        <source>No Averaging</source>
+        <translation>Keine Mittelung</translation>
+    </message>
+    <message>
+        <source>Averaging 3</source>
+        <translation>Mittelung 3</translation>
+    </message>
+    <message>
+        <source>Averaging 5</source>
+        <translation>Mittelung 5</translation>
+    </message>
+    <message>
+        <source>SMC m:n</source>
+        <translation>SMC m:n</translation>
+    </message>
+    <message>
+        <source>White Tile</source>
+        <translation>Weißstandard</translation>
+    </message>
+    <message>
+        <source>Reference Tile</source>
+        <translation>Referenzstandard</translation>
+    </message>
+    <message>
+        <source>Lifted</source>
+        <translation>Abgehoben</translation>
+    </message>
+    <message>
+        <source>White Tile Complete</source>
+        <translation>Weißstandard fertig</translation>
+    </message>
+    <message>
+        <source>Reference Tile Complete</source>
+        <translation>Referenzstandard fertig</translation>
+    </message>
+    <message>
+        <source>Lifted Complete</source>
+        <translation>Abheben fertig</translation>
+    </message>
+</context>
+<context>
     <name>SyncScreen</name>
     <message>
         <source>Syncing Job Data</source>
@@ -227,6 +574,13 @@
     <message>
         <source>Back</source>
         <translation>Zurück</translation>
+    </message>
+</context>
+<context>
+    <name>WebSyncButton</name>
+    <message>
+        <source>Send All Jobs To Server</source>
+        <translation>Alle Aufträge an Server senden</translation>
     </message>
 </context>
 </TS>

@@ -160,10 +160,126 @@
     </message>
 </context>
 <context>
+    <name>JobActionsPopup</name>
+    <message>
+        <source>Delete Job</source>
+        <translation>Eliminar trabajo</translation>
+    </message>
+    <message>
+        <source>View/Edit Job</source>
+        <translation>Ver/editar trabajo</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Cancelar</translation>
+    </message>
+    <message>
+        <source>Copy Job</source>
+        <translation>Copiar trabajo</translation>
+    </message>
+    <message>
+        <source>Send Job To Server</source>
+        <translation>Enviar trabajo al servidor</translation>
+    </message>
+    <message>
+        <source>Execute Job</source>
+        <translation>Ejecutar trabajo</translation>
+    </message>
+</context>
+<context>
+    <name>JobListQuickSelectionItem</name>
+    <message>
+        <source>Delete All Completed Jobs</source>
+        <translation>Eliminar todos los trabajos completados</translation>
+    </message>
+</context>
+<context>
+    <name>JobListScreen</name>
+    <message>
+        <source>Jobs</source>
+        <translation>Trabajos</translation>
+    </message>
+    <message>
+        <source>+</source>
+        <translation>+</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Abiertos</translation>
+    </message>
+    <message>
+        <source>Complete</source>
+        <translation>Completados</translation>
+    </message>
+    <message>
+        <source>Open (%1)</source>
+        <translation>Abiertos (%1)</translation>
+    </message>
+    <message>
+        <source>Complete (%1)</source>
+        <translation>Completados (%1)</translation>
+    </message>
+    <message>
+        <source>Delete Job?</source>
+        <translation>¿Eliminar trabajo?</translation>
+    </message>
+    <message>
+        <source>The entire job and all samples will be permanently deleted.</source>
+        <translation>El trabajo completo y todas sus muestras se eliminarán de forma permanente.</translation>
+    </message>
+    <message>
+        <source>Delete All Completed Jobs?</source>
+        <translation>¿Eliminar todos los trabajos completados?</translation>
+    </message>
+    <message>
+        <source>All completed jobs will be permanently deleted.</source>
+        <translation>Todos los trabajos completados se eliminarán de forma permanente.</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>Aceptar</translation>
+    </message>
+    <message>
+        <source>Instrument Is Full</source>
+        <translation>Memoria del instrumento llena</translation>
+    </message>
+    <message>
+        <source>A new job cannot be created until one or more existing jobs are removed from the instrument.</source>
+        <translation>No se puede crear un trabajo nuevo hasta que se eliminen uno o más trabajos del instrumento.</translation>
+    </message>
+    <message>
+        <source>There is not enough memory to complete the requested Job. Please remove existing jobs to free up memory.</source>
+        <translation>No hay memoria suficiente para completar el trabajo. Elimine trabajos existentes para liberar memoria.</translation>
+    </message>
+</context>
+<context>
     <name>LockScreen</name>
     <message>
         <source>Instrument Locked</source>
         <translation>Instrumento bloqueado</translation>
+    </message>
+</context>
+<context>
+    <name>MeasuringPopup</name>
+    <message>
+        <source>Measuring</source>
+        <translation>Midiendo</translation>
+    </message>
+    <message>
+        <source>Hold Steady</source>
+        <translation>Mantenga firme</translation>
+    </message>
+    <message>
+        <source>Do not touch or bump instrument</source>
+        <translation>No toque ni golpee el instrumento</translation>
+    </message>
+    <message>
+        <source>Calculating</source>
+        <translation>Calculando</translation>
+    </message>
+    <message>
+        <source>OK to move instrument</source>
+        <translation>Ya puede mover el instrumento</translation>
     </message>
 </context>
 <context>
@@ -197,6 +313,237 @@
     </message>
 </context>
 <context>
+    <name>StringTables</name>
+    <message>
+        <source>English</source>
+        <translation>Inglés</translation>
+    </message>
+    <message>
+        <source>Spanish</source>
+        <translation>Español</translation>
+    </message>
+    <message>
+        <source>French</source>
+        <translation>Francés</translation>
+    </message>
+    <message>
+        <source>German</source>
+        <translation>Alemán</translation>
+    </message>
+    <message>
+        <source>Italian</source>
+        <translation>Italiano</translation>
+    </message>
+    <message>
+        <source>Portuguese</source>
+        <translation>Portugués</translation>
+    </message>
+    <message>
+        <source>Japanese</source>
+        <translation>Japonés</translation>
+    </message>
+    <message>
+        <source>Korean</source>
+        <translation>Coreano</translation>
+    </message>
+    <message>
+        <source>Chinese Simplified</source>
+        <translation>Chino simplificado</translation>
+    </message>
+    <message>
+        <source>Custom</source>
+        <translation>Personalizado</translation>
+    </message>
+    <message>
+        <source>-45%1</source>
+        <translation>-45%1</translation>
+    </message>
+    <message>
+        <source>-15%1</source>
+        <translation>-15%1</translation>
+    </message>
+    <message>
+        <source>15%1</source>
+        <translation>15%1</translation>
+    </message>
+    <message>
+        <source>45%1</source>
+        <translation>45%1</translation>
+    </message>
+    <message>
+        <source>80%1</source>
+        <translation>80%1</translation>
+    </message>
+    <message>
+        <source>Diffuse</source>
+        <translation>Difusa</translation>
+    </message>
+    <message>
+        <source>25%1</source>
+        <translation>25%1</translation>
+    </message>
+    <message>
+        <source>75%1</source>
+        <translation>75%1</translation>
+    </message>
+    <message>
+        <source>110%1</source>
+        <translation>110%1</translation>
+    </message>
+    <message>
+        <source>A/2%1</source>
+        <translation>A/2%1</translation>
+    </message>
+    <message>
+        <source>A/10%1</source>
+        <translation>A/10%1</translation>
+    </message>
+    <message>
+        <source>C/2%1</source>
+        <translation>C/2%1</translation>
+    </message>
+    <message>
+        <source>C/10%1</source>
+        <translation>C/10%1</translation>
+    </message>
+    <message>
+        <source>D50/2%1</source>
+        <translation>D50/2%1</translation>
+    </message>
+    <message>
+        <source>D50/10%1</source>
+        <translation>D50/10%1</translation>
+    </message>
+    <message>
+        <source>D55/2%1</source>
+        <translation>D55/2%1</translation>
+    </message>
+    <message>
+        <source>D55/10%1</source>
+        <translation>D55/10%1</translation>
+    </message>
+    <message>
+        <source>D65/2%1</source>
+        <translation>D65/2%1</translation>
+    </message>
+    <message>
+        <source>D65/10%1</source>
+        <translation>D65/10%1</translation>
+    </message>
+    <message>
+        <source>D75/2%1</source>
+        <translation>D75/2%1</translation>
+    </message>
+    <message>
+        <source>D75/10%1</source>
+        <translation>D75/10%1</translation>
+    </message>
+    <message>
+        <source>F2/2%1</source>
+        <translation>F2/2%1</translation>
+    </message>
+    <message>
+        <source>F2/10%1</source>
+        <translation>F2/10%1</translation>
+    </message>
+    <message>
+        <source>F7/2%1</source>
+        <translation>F7/2%1</translation>
+    </message>
+    <message>
+        <source>F7/10%1</source>
+        <translation>F7/10%1</translation>
+    </message>
+    <message>
+        <source>F8/2%1</source>
+        <translation>F8/2%1</translation>
+    </message>
+    <message>
+        <source>F8/10%1</source>
+        <translation>F8/10%1</translation>
+    </message>
+    <message>
+        <source>F10/2%1</source>
+        <translation>F10/2%1</translation>
+    </message>
+    <message>
+        <source>F10/10%1</source>
+        <translation>F10/10%1</translation>
+    </message>
+    <message>
+        <source>F11/2%1</source>
+        <translation>F11/2%1</translation>
+    </message>
+    <message>
+        <source>F11/10%1</source>
+        <translation>F11/10%1</translation>
+    </message>
+    <message>
+        <source>F12/2%1</source>
+        <translation>F12/2%1</translation>
+    </message>
+    <message>
+        <source>F12/10%1</source>
+        <translation>F12/10%1</translation>
+    </message>
+    <message>
+        <source>Mid Tier</source>
+        <translation>Gama media</translation>
+    </message>
+    <message>
+        <source>ALDER</source>
+        <translation>ALDER</translation>
+    </message>
+    <message>
+        <source>BIRCH</source>
+        <translation>BIRCH</translation>
+    </message>
+    <message>
+        <source>QC</source>
+        <translation>QC</translation>
+    </message>
+    <message>
+        <source>No Averaging</source>
+        <translation>Sin promedio</translation>
+    </message>
+    <message>
+        <source>Averaging 3</source>
+        <translation>Promedio 3</translation>
+    </message>
+    <message>
+        <source>Averaging 5</source>
+        <translation>Promedio 5</translation>
+    </message>
+    <message>
+        <source>SMC m:n</source>
+        <translation>SMC m:n</translation>
+    </message>
+    <message>
+        <source>White Tile</source>
+        <translation>Patrón blanco</translation>
+    </message>
+    <message>
+        <source>Reference Tile</source>
+        <translation>Patrón de referencia</translation>
+    </message>
+    <message>
+        <source>Lifted</source>
+        <translation>Levantado</translation>
+    </message>
+    <message>
+        <source>White Tile Complete</source>
+        <translation>Patrón blanco completado</translation>
+    </message>
+    <message>
+        <source>Reference Tile Complete</source>
+        <translation>Patrón de referencia completado</translation>
+    </message>
+    <message>
+        <source>Lifted Complete</source>
+        <translation>Levantado completado</translation>
+    </message>
+</context>
+<context>
     <name>SyncScreen</name>
     <message>
         <source>Syncing Job Data</source>
@@ -227,6 +574,13 @@
     <message>
         <source>Back</source>
         <translation>Atrás</translation>
+    </message>
+</context>
+<context>
+    <name>WebSyncButton</name>
+    <message>
+        <source>Send All Jobs To Server</source>
+        <translation>Enviar todos los trabajos al servidor</translation>
     </message>
 </context>
 </TS>

@@ -13,7 +13,7 @@
     </message>
     <message>
         <source>Instrument Is Full</source>
-        <translation>Mémoire de l&apos;instrument pleine</translation>
+        <translation>Mémoire pleine</translation>
     </message>
     <message>
         <source>There is not enough memory to complete the requested Job. Please remove existing jobs to free up memory.</source>
@@ -160,10 +160,126 @@
     </message>
 </context>
 <context>
+    <name>JobActionsPopup</name>
+    <message>
+        <source>Delete Job</source>
+        <translation>Supprimer le travail</translation>
+    </message>
+    <message>
+        <source>View/Edit Job</source>
+        <translation>Voir/modifier le travail</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Annuler</translation>
+    </message>
+    <message>
+        <source>Copy Job</source>
+        <translation>Copier le travail</translation>
+    </message>
+    <message>
+        <source>Send Job To Server</source>
+        <translation>Envoyer le travail au serveur</translation>
+    </message>
+    <message>
+        <source>Execute Job</source>
+        <translation>Exécuter le travail</translation>
+    </message>
+</context>
+<context>
+    <name>JobListQuickSelectionItem</name>
+    <message>
+        <source>Delete All Completed Jobs</source>
+        <translation>Supprimer tous les travaux terminés</translation>
+    </message>
+</context>
+<context>
+    <name>JobListScreen</name>
+    <message>
+        <source>Jobs</source>
+        <translation>Travaux</translation>
+    </message>
+    <message>
+        <source>+</source>
+        <translation>+</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>Ouverts</translation>
+    </message>
+    <message>
+        <source>Complete</source>
+        <translation>Terminés</translation>
+    </message>
+    <message>
+        <source>Open (%1)</source>
+        <translation>Ouverts (%1)</translation>
+    </message>
+    <message>
+        <source>Complete (%1)</source>
+        <translation>Terminés (%1)</translation>
+    </message>
+    <message>
+        <source>Delete Job?</source>
+        <translation>Supprimer le travail ?</translation>
+    </message>
+    <message>
+        <source>The entire job and all samples will be permanently deleted.</source>
+        <translation>Le travail entier et tous ses échantillons seront définitivement supprimés.</translation>
+    </message>
+    <message>
+        <source>Delete All Completed Jobs?</source>
+        <translation>Supprimer tous les travaux terminés ?</translation>
+    </message>
+    <message>
+        <source>All completed jobs will be permanently deleted.</source>
+        <translation>Tous les travaux terminés seront définitivement supprimés.</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+    <message>
+        <source>Instrument Is Full</source>
+        <translation>Mémoire pleine</translation>
+    </message>
+    <message>
+        <source>A new job cannot be created until one or more existing jobs are removed from the instrument.</source>
+        <translation>Impossible de créer un travail tant qu&apos;un ou plusieurs travaux n&apos;ont pas été supprimés de l&apos;instrument.</translation>
+    </message>
+    <message>
+        <source>There is not enough memory to complete the requested Job. Please remove existing jobs to free up memory.</source>
+        <translation>La mémoire est insuffisante pour ce travail. Supprimez des travaux existants pour libérer de la mémoire.</translation>
+    </message>
+</context>
+<context>
     <name>LockScreen</name>
     <message>
         <source>Instrument Locked</source>
         <translation>Instrument verrouillé</translation>
+    </message>
+</context>
+<context>
+    <name>MeasuringPopup</name>
+    <message>
+        <source>Measuring</source>
+        <translation>Mesure en cours</translation>
+    </message>
+    <message>
+        <source>Hold Steady</source>
+        <translation>Ne bougez pas</translation>
+    </message>
+    <message>
+        <source>Do not touch or bump instrument</source>
+        <translation>Ne touchez pas et ne heurtez pas l&apos;instrument</translation>
+    </message>
+    <message>
+        <source>Calculating</source>
+        <translation>Calcul en cours</translation>
+    </message>
+    <message>
+        <source>OK to move instrument</source>
+        <translation>Vous pouvez déplacer l&apos;instrument</translation>
     </message>
 </context>
 <context>
@@ -197,6 +313,237 @@
     </message>
 </context>
 <context>
+    <name>StringTables</name>
+    <message>
+        <source>English</source>
+        <translation>Anglais</translation>
+    </message>
+    <message>
+        <source>Spanish</source>
+        <translation>Espagnol</translation>
+    </message>
+    <message>
+        <source>French</source>
+        <translation>Français</translation>
+    </message>
+    <message>
+        <source>German</source>
+        <translation>Allemand</translation>
+    </message>
+    <message>
+        <source>Italian</source>
+        <translation>Italien</translation>
+    </message>
+    <message>
+        <source>Portuguese</source>
+        <translation>Portugais</translation>
+    </message>
+    <message>
+        <source>Japanese</source>
+        <translation>Japonais</translation>
+    </message>
+    <message>
+        <source>Korean</source>
+        <translation>Coréen</translation>
+    </message>
+    <message>
+        <source>Chinese Simplified</source>
+        <translation>Chinois simplifié</translation>
+    </message>
+    <message>
+        <source>Custom</source>
+        <translation>Personnalisé</translation>
+    </message>
+    <message>
+        <source>-45%1</source>
+        <translation>-45%1</translation>
+    </message>
+    <message>
+        <source>-15%1</source>
+        <translation>-15%1</translation>
+    </message>
+    <message>
+        <source>15%1</source>
+        <translation>15%1</translation>
+    </message>
+    <message>
+        <source>45%1</source>
+        <translation>45%1</translation>
+    </message>
+    <message>
+        <source>80%1</source>
+        <translation>80%1</translation>
+    </message>
+    <message>
+        <source>Diffuse</source>
+        <translation>Diffuse</translation>
+    </message>
+    <message>
+        <source>25%1</source>
+        <translation>25%1</translation>
+    </message>
+    <message>
+        <source>75%1</source>
+        <translation>75%1</translation>
+    </message>
+    <message>
+        <source>110%1</source>
+        <translation>110%1</translation>
+    </message>
+    <message>
+        <source>A/2%1</source>
+        <translation>A/2%1</translation>
+    </message>
+    <message>
+        <source>A/10%1</source>
+        <translation>A/10%1</translation>
+    </message>
+    <message>
+        <source>C/2%1</source>
+        <translation>C/2%1</translation>
+    </message>
+    <message>
+        <source>C/10%1</source>
+        <translation>C/10%1</translation>
+    </message>
+    <message>
+        <source>D50/2%1</source>
+        <translation>D50/2%1</translation>
+    </message>
+    <message>
+        <source>D50/10%1</source>
+        <translation>D50/10%1</translation>
+    </message>
+    <message>
+        <source>D55/2%1</source>
+        <translation>D55/2%1</translation>
+    </message>
+    <message>
+        <source>D55/10%1</source>
+        <translation>D55/10%1</translation>
+    </message>
+    <message>
+        <source>D65/2%1</source>
+        <translation>D65/2%1</translation>
+    </message>
+    <message>
+        <source>D65/10%1</source>
+        <translation>D65/10%1</translation>
+    </message>
+    <message>
+        <source>D75/2%1</source>
+        <translation>D75/2%1</translation>
+    </message>
+    <message>
+        <source>D75/10%1</source>
+        <translation>D75/10%1</translation>
+    </message>
+    <message>
+        <source>F2/2%1</source>
+        <translation>F2/2%1</translation>
+    </message>
+    <message>
+        <source>F2/10%1</source>
+        <translation>F2/10%1</translation>
+    </message>
+    <message>
+        <source>F7/2%1</source>
+        <translation>F7/2%1</translation>
+    </message>
+    <message>
+        <source>F7/10%1</source>
+        <translation>F7/10%1</translation>
+    </message>
+    <message>
+        <source>F8/2%1</source>
+        <translation>F8/2%1</translation>
+    </message>
+    <message>
+        <source>F8/10%1</source>
+        <translation>F8/10%1</translation>
+    </message>
+    <message>
+        <source>F10/2%1</source>
+        <translation>F10/2%1</translation>
+    </message>
+    <message>
+        <source>F10/10%1</source>
+        <translation>F10/10%1</translation>
+    </message>
+    <message>
+        <source>F11/2%1</source>
+        <translation>F11/2%1</translation>
+    </message>
+    <message>
+        <source>F11/10%1</source>
+        <translation>F11/10%1</translation>
+    </message>
+    <message>
+        <source>F12/2%1</source>
+        <translation>F12/2%1</translation>
+    </message>
+    <message>
+        <source>F12/10%1</source>
+        <translation>F12/10%1</translation>
+    </message>
+    <message>
+        <source>Mid Tier</source>
+        <translation>Milieu de gamme</translation>
+    </message>
+    <message>
+        <source>ALDER</source>
+        <translation>ALDER</translation>
+    </message>
+    <message>
+        <source>BIRCH</source>
+        <translation>BIRCH</translation>
+    </message>
+    <message>
+        <source>QC</source>
+        <translation>QC</translation>
+    </message>
+    <message>
+        <source>No Averaging</source>
+        <translation>Sans moyenne</translation>
+    </message>
+    <message>
+        <source>Averaging 3</source>
+        <translation>Moyenne 3</translation>
+    </message>
+    <message>
+        <source>Averaging 5</source>
+        <translation>Moyenne 5</translation>
+    </message>
+    <message>
+        <source>SMC m:n</source>
+        <translation>SMC m:n</translation>
+    </message>
+    <message>
+        <source>White Tile</source>
+        <translation>Céramique blanche</translation>
+    </message>
+    <message>
+        <source>Reference Tile</source>
+        <translation>Céramique de référence</translation>
+    </message>
+    <message>
+        <source>Lifted</source>
+        <translation>Soulevé</translation>
+    </message>
+    <message>
+        <source>White Tile Complete</source>
+        <translation>Céramique blanche terminée</translation>
+    </message>
+    <message>
+        <source>Reference Tile Complete</source>
+        <translation>Céramique de référence terminée</translation>
+    </message>
+    <message>
+        <source>Lifted Complete</source>
+        <translation>Soulevé terminé</translation>
+    </message>
+</context>
+<context>
     <name>SyncScreen</name>
     <message>
         <source>Syncing Job Data</source>
@@ -227,6 +574,13 @@
     <message>
         <source>Back</source>
         <translation>Retour</translation>
+    </message>
+</context>
+<context>
+    <name>WebSyncButton</name>
+    <message>
+        <source>Send All Jobs To Server</source>
+        <translation>Envoyer tous les travaux au serveur</translation>
     </message>
 </context>
 </TS>

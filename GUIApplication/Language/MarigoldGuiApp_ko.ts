@@ -1,0 +1,586 @@
+<?xml version="1.0" encoding="utf-8"?>
+<!DOCTYPE TS>
+<TS version="2.1" language="ko_KR">
+<context>
+    <name>DaddyPanel</name>
+    <message>
+        <source>Warning</source>
+        <translation>경고</translation>
+    </message>
+    <message>
+        <source>Reference Check Failed</source>
+        <translation>기준 점검 실패</translation>
+    </message>
+    <message>
+        <source>Instrument Is Full</source>
+        <translation>기기 메모리 가득 참</translation>
+    </message>
+    <message>
+        <source>There is not enough memory to complete the requested Job. Please remove existing jobs to free up memory.</source>
+        <translation>작업을 완료할 메모리가 부족합니다. 기존 작업을 삭제하여 메모리를 확보하십시오.</translation>
+    </message>
+    <message>
+        <source>Error</source>
+        <translation>오류</translation>
+    </message>
+    <message>
+        <source>No database entries</source>
+        <translation>데이터베이스 항목 없음</translation>
+    </message>
+    <message>
+        <source>Measurement Cancelled</source>
+        <translation>측정 취소됨</translation>
+    </message>
+    <message>
+        <source>The instrument was moved during a measurement</source>
+        <translation>측정 중에 기기가 움직였습니다</translation>
+    </message>
+    <message>
+        <source>Index invalid</source>
+        <translation>잘못된 인덱스</translation>
+    </message>
+    <message>
+        <source>Calibration Error</source>
+        <translation>교정 오류</translation>
+    </message>
+    <message>
+        <source>Instrument not on white tile, or internal white dirty</source>
+        <translation>기기가 백색 타일 위에 없거나 내부 백색이 오염됨</translation>
+    </message>
+    <message>
+        <source>Calibration data not valid</source>
+        <translation>교정 데이터가 유효하지 않음</translation>
+    </message>
+    <message>
+        <source>Not calibrated</source>
+        <translation>교정되지 않음</translation>
+    </message>
+    <message>
+        <source>External white tile too dirty or incorrect white tile</source>
+        <translation>외부 백색 타일이 너무 더럽거나 잘못된 타일임</translation>
+    </message>
+    <message>
+        <source>Measurement Aborted</source>
+        <translation>측정 중단됨</translation>
+    </message>
+    <message>
+        <source>The measurement has been aborted by the user</source>
+        <translation>사용자가 측정을 중단했습니다</translation>
+    </message>
+    <message>
+        <source>Battery is low. Charge the battery</source>
+        <translation>배터리 부족. 배터리를 충전하십시오</translation>
+    </message>
+    <message>
+        <source>Battery is empty. Instrument will shut down</source>
+        <translation>배터리 방전. 기기가 꺼집니다</translation>
+    </message>
+    <message>
+        <source>Error in shutter motor</source>
+        <translation>셔터 모터 오류</translation>
+    </message>
+    <message>
+        <source>No stored reference measurement</source>
+        <translation>저장된 기준 측정 없음</translation>
+    </message>
+    <message>
+        <source>Spectral integration time on white too long</source>
+        <translation>백색 분광 적분 시간이 너무 깁니다</translation>
+    </message>
+    <message>
+        <source>Wavelength shift above absolute limit of 5 nm</source>
+        <translation>파장 편이가 절대 한계 5 nm를 초과함</translation>
+    </message>
+    <message>
+        <source>Low Storage</source>
+        <translation>저장 공간 부족</translation>
+    </message>
+    <message>
+        <source>Problem occurred changing Wi-Fi modes</source>
+        <translation>Wi-Fi 모드 변경 중 문제 발생</translation>
+    </message>
+    <message>
+        <source>Problem occurred scanning for Wi-Fi</source>
+        <translation>Wi-Fi 검색 중 문제 발생</translation>
+    </message>
+    <message>
+        <source>Sample temperature too high (IR Sensor)</source>
+        <translation>샘플 온도가 너무 높음 (IR 센서)</translation>
+    </message>
+    <message>
+        <source>Sample temperature too low (IR Sensor)</source>
+        <translation>샘플 온도가 너무 낮음 (IR 센서)</translation>
+    </message>
+    <message>
+        <source>Battery level is too low for update</source>
+        <translation>업데이트하기에 배터리 잔량이 너무 적습니다</translation>
+    </message>
+    <message>
+        <source>Date and time not set</source>
+        <translation>날짜와 시간이 설정되지 않음</translation>
+    </message>
+    <message>
+        <source>Problem during initialization. Please reboot the device</source>
+        <translation>초기화 중 문제가 발생했습니다. 기기를 재부팅하십시오</translation>
+    </message>
+    <message>
+        <source>Hardware communication error. Please reboot the device</source>
+        <translation>하드웨어 통신 오류. 기기를 재부팅하십시오</translation>
+    </message>
+    <message>
+        <source>Error during measurement</source>
+        <translation>측정 중 오류</translation>
+    </message>
+    <message>
+        <source>Different best matches for checkpoints</source>
+        <translation>체크포인트의 최적 일치가 서로 다름</translation>
+    </message>
+    <message>
+        <source>Calibrating</source>
+        <translation>교정 중</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>확인</translation>
+    </message>
+</context>
+<context>
+    <name>DeletePopup</name>
+    <message>
+        <source>Delete All Samples?</source>
+        <translation>모든 샘플을 삭제하시겠습니까?</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>삭제</translation>
+    </message>
+    <message>
+        <source>No</source>
+        <translation>아니요</translation>
+    </message>
+</context>
+<context>
+    <name>JobActionsPopup</name>
+    <message>
+        <source>Delete Job</source>
+        <translation>작업 삭제</translation>
+    </message>
+    <message>
+        <source>View/Edit Job</source>
+        <translation>작업 보기/편집</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>취소</translation>
+    </message>
+    <message>
+        <source>Copy Job</source>
+        <translation>작업 복사</translation>
+    </message>
+    <message>
+        <source>Send Job To Server</source>
+        <translation>작업을 서버로 전송</translation>
+    </message>
+    <message>
+        <source>Execute Job</source>
+        <translation>작업 실행</translation>
+    </message>
+</context>
+<context>
+    <name>JobListQuickSelectionItem</name>
+    <message>
+        <source>Delete All Completed Jobs</source>
+        <translation>완료된 작업 모두 삭제</translation>
+    </message>
+</context>
+<context>
+    <name>JobListScreen</name>
+    <message>
+        <source>Jobs</source>
+        <translation>작업</translation>
+    </message>
+    <message>
+        <source>+</source>
+        <translation>+</translation>
+    </message>
+    <message>
+        <source>Open</source>
+        <translation>진행 중</translation>
+    </message>
+    <message>
+        <source>Complete</source>
+        <translation>완료</translation>
+    </message>
+    <message>
+        <source>Open (%1)</source>
+        <translation>진행 중 (%1)</translation>
+    </message>
+    <message>
+        <source>Complete (%1)</source>
+        <translation>완료 (%1)</translation>
+    </message>
+    <message>
+        <source>Delete Job?</source>
+        <translation>작업을 삭제하시겠습니까?</translation>
+    </message>
+    <message>
+        <source>The entire job and all samples will be permanently deleted.</source>
+        <translation>작업 전체와 모든 샘플이 영구적으로 삭제됩니다.</translation>
+    </message>
+    <message>
+        <source>Delete All Completed Jobs?</source>
+        <translation>완료된 작업을 모두 삭제하시겠습니까?</translation>
+    </message>
+    <message>
+        <source>All completed jobs will be permanently deleted.</source>
+        <translation>완료된 작업이 모두 영구적으로 삭제됩니다.</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>확인</translation>
+    </message>
+    <message>
+        <source>Instrument Is Full</source>
+        <translation>기기 메모리 가득 참</translation>
+    </message>
+    <message>
+        <source>A new job cannot be created until one or more existing jobs are removed from the instrument.</source>
+        <translation>기기에서 기존 작업을 하나 이상 삭제해야 새 작업을 만들 수 있습니다.</translation>
+    </message>
+    <message>
+        <source>There is not enough memory to complete the requested Job. Please remove existing jobs to free up memory.</source>
+        <translation>작업을 완료할 메모리가 부족합니다. 기존 작업을 삭제하여 메모리를 확보하십시오.</translation>
+    </message>
+</context>
+<context>
+    <name>LockScreen</name>
+    <message>
+        <source>Instrument Locked</source>
+        <translation>기기 잠김</translation>
+    </message>
+</context>
+<context>
+    <name>MeasuringPopup</name>
+    <message>
+        <source>Measuring</source>
+        <translation>측정 중</translation>
+    </message>
+    <message>
+        <source>Hold Steady</source>
+        <translation>움직이지 마십시오</translation>
+    </message>
+    <message>
+        <source>Do not touch or bump instrument</source>
+        <translation>기기를 만지거나 부딪히지 마십시오</translation>
+    </message>
+    <message>
+        <source>Calculating</source>
+        <translation>계산 중</translation>
+    </message>
+    <message>
+        <source>OK to move instrument</source>
+        <translation>기기를 움직여도 됩니다</translation>
+    </message>
+</context>
+<context>
+    <name>PowerDownPopup</name>
+    <message>
+        <source>Power Off</source>
+        <translation>전원 끄기</translation>
+    </message>
+    <message>
+        <source>Reboot</source>
+        <translation>재부팅</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>취소</translation>
+    </message>
+</context>
+<context>
+    <name>SadPuppyScreen</name>
+    <message>
+        <source>Error</source>
+        <translation>오류</translation>
+    </message>
+    <message>
+        <source>An error has occurred, please reboot the instrument</source>
+        <translation>오류가 발생했습니다. 기기를 재부팅하십시오</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>확인</translation>
+    </message>
+</context>
+<context>
+    <name>StringTables</name>
+    <message>
+        <source>English</source>
+        <translation>영어</translation>
+    </message>
+    <message>
+        <source>Spanish</source>
+        <translation>스페인어</translation>
+    </message>
+    <message>
+        <source>French</source>
+        <translation>프랑스어</translation>
+    </message>
+    <message>
+        <source>German</source>
+        <translation>독일어</translation>
+    </message>
+    <message>
+        <source>Italian</source>
+        <translation>이탈리아어</translation>
+    </message>
+    <message>
+        <source>Portuguese</source>
+        <translation>포르투갈어</translation>
+    </message>
+    <message>
+        <source>Japanese</source>
+        <translation>일본어</translation>
+    </message>
+    <message>
+        <source>Korean</source>
+        <translation>한국어</translation>
+    </message>
+    <message>
+        <source>Chinese Simplified</source>
+        <translation>중국어 간체</translation>
+    </message>
+    <message>
+        <source>Custom</source>
+        <translation>사용자 지정</translation>
+    </message>
+    <message>
+        <source>-45%1</source>
+        <translation>-45%1</translation>
+    </message>
+    <message>
+        <source>-15%1</source>
+        <translation>-15%1</translation>
+    </message>
+    <message>
+        <source>15%1</source>
+        <translation>15%1</translation>
+    </message>
+    <message>
+        <source>45%1</source>
+        <translation>45%1</translation>
+    </message>
+    <message>
+        <source>80%1</source>
+        <translation>80%1</translation>
+    </message>
+    <message>
+        <source>Diffuse</source>
+        <translation>확산</translation>
+    </message>
+    <message>
+        <source>25%1</source>
+        <translation>25%1</translation>
+    </message>
+    <message>
+        <source>75%1</source>
+        <translation>75%1</translation>
+    </message>
+    <message>
+        <source>110%1</source>
+        <translation>110%1</translation>
+    </message>
+    <message>
+        <source>A/2%1</source>
+        <translation>A/2%1</translation>
+    </message>
+    <message>
+        <source>A/10%1</source>
+        <translation>A/10%1</translation>
+    </message>
+    <message>
+        <source>C/2%1</source>
+        <translation>C/2%1</translation>
+    </message>
+    <message>
+        <source>C/10%1</source>
+        <translation>C/10%1</translation>
+    </message>
+    <message>
+        <source>D50/2%1</source>
+        <translation>D50/2%1</translation>
+    </message>
+    <message>
+        <source>D50/10%1</source>
+        <translation>D50/10%1</translation>
+    </message>
+    <message>
+        <source>D55/2%1</source>
+        <translation>D55/2%1</translation>
+    </message>
+    <message>
+        <source>D55/10%1</source>
+        <translation>D55/10%1</translation>
+    </message>
+    <message>
+        <source>D65/2%1</source>
+        <translation>D65/2%1</translation>
+    </message>
+    <message>
+        <source>D65/10%1</source>
+        <translation>D65/10%1</translation>
+    </message>
+    <message>
+        <source>D75/2%1</source>
+        <translation>D75/2%1</translation>
+    </message>
+    <message>
+        <source>D75/10%1</source>
+        <translation>D75/10%1</translation>
+    </message>
+    <message>
+        <source>F2/2%1</source>
+        <translation>F2/2%1</translation>
+    </message>
+    <message>
+        <source>F2/10%1</source>
+        <translation>F2/10%1</translation>
+    </message>
+    <message>
+        <source>F7/2%1</source>
+        <translation>F7/2%1</translation>
+    </message>
+    <message>
+        <source>F7/10%1</source>
+        <translation>F7/10%1</translation>
+    </message>
+    <message>
+        <source>F8/2%1</source>
+        <translation>F8/2%1</translation>
+    </message>
+    <message>
+        <source>F8/10%1</source>
+        <translation>F8/10%1</translation>
+    </message>
+    <message>
+        <source>F10/2%1</source>
+        <translation>F10/2%1</translation>
+    </message>
+    <message>
+        <source>F10/10%1</source>
+        <translation>F10/10%1</translation>
+    </message>
+    <message>
+        <source>F11/2%1</source>
+        <translation>F11/2%1</translation>
+    </message>
+    <message>
+        <source>F11/10%1</source>
+        <translation>F11/10%1</translation>
+    </message>
+    <message>
+        <source>F12/2%1</source>
+        <translation>F12/2%1</translation>
+    </message>
+    <message>
+        <source>F12/10%1</source>
+        <translation>F12/10%1</translation>
+    </message>
+    <message>
+        <source>Mid Tier</source>
+        <translation>중급형</translation>
+    </message>
+    <message>
+        <source>ALDER</source>
+        <translation>ALDER</translation>
+    </message>
+    <message>
+        <source>BIRCH</source>
+        <translation>BIRCH</translation>
+    </message>
+    <message>
+        <source>QC</source>
+        <translation>QC</translation>
+    </message>
+    <message>
+        <source>No Averaging</source>
+        <translation>평균 없음</translation>
+    </message>
+    <message>
+        <source>Averaging 3</source>
+        <translation>3회 평균</translation>
+    </message>
+    <message>
+        <source>Averaging 5</source>
+        <translation>5회 평균</translation>
+    </message>
+    <message>
+        <source>SMC m:n</source>
+        <translation>SMC m:n</translation>
+    </message>
+    <message>
+        <source>White Tile</source>
+        <translation>백색 타일</translation>
+    </message>
+    <message>
+        <source>Reference Tile</source>
+        <translation>기준 타일</translation>
+    </message>
+    <message>
+        <source>Lifted</source>
+        <translation>들어 올림</translation>
+    </message>
+    <message>
+        <source>White Tile Complete</source>
+        <translation>백색 타일 완료</translation>
+    </message>
+    <message>
+        <source>Reference Tile Complete</source>
+        <translation>기준 타일 완료</translation>
+    </message>
+    <message>
+        <source>Lifted Complete</source>
+        <translation>들어 올림 완료</translation>
+    </message>
+</context>
+<context>
+    <name>SyncScreen</name>
+    <message>
+        <source>Syncing Job Data</source>
+        <translation>작업 데이터 동기화 중</translation>
+    </message>
+</context>
+<context>
+    <name>TerminateJobPopup</name>
+    <message>
+        <source>Store Average</source>
+        <translation>평균 저장</translation>
+    </message>
+    <message>
+        <source>Restart Job</source>
+        <translation>작업 다시 시작</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>취소</translation>
+    </message>
+</context>
+<context>
+    <name>UndoPopup</name>
+    <message>
+        <source>Undo</source>
+        <translation>실행 취소</translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation>뒤로</translation>
+    </message>
+</context>
+<context>
+    <name>WebSyncButton</name>
+    <message>
+        <source>Send All Jobs To Server</source>
+        <translation>모든 작업을 서버로 전송</translation>
+    </message>
+</context>
+</TS>
