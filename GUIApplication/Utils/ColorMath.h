@@ -132,4 +132,103 @@ bool_t ColorMath_CIELabToCIELCH(const CIELABCOORD* pLAB, CIELCHCOORD* pLch);
 // Not available: always false.
 bool_t ColorMath_RGBToXYZ(const COLOR_REF* pcr, XYZCOORD* pXYZ);
 
+// ---- Colour differences ------------------------------------------------------
+// Trial (sample) minus standard throughout. The arrays of the Calc functions
+// hold three values: L, a, b or L, C, h; the coefficient arrays kL, kC, kH.
+
+bool_t ColorMath_LabToDElab(const CIELABCOORD* pLabTrial, const CIELABCOORD* pLabStandard, double* pDElab);
+// The squared difference only, in plain double arithmetic, for best-match searches.
+void ColorMath_BestMatchDElabSquaredCalc(const CIELABCOORD* pLab1, const CIELABCOORD* pLab2, double* pSquared);
+bool_t ColorMath_HunterLabToDE(const HUNTERLABCOORD* pTrial, const HUNTERLABCOORD* pStandard, double* pDE);
+bool_t ColorMath_CIELuvToDEuv(const CIELUVCOORD* pTrial, const CIELUVCOORD* pStandard, double* pDE);
+// Signed hue difference; the sign is that of the hue angle difference.
+double ColorMath_CalcDeltaH(const double* fLabSmp, const double* fLabStd, const double* fLChSmp,
+                            const double* fLChStd);
+bool_t ColorMath_CalcDeltaLabLCH(const double* fLabSmp, const double* fLabStd, const double* fLChSmp,
+                                 const double* fLChStd, double* fLabRslt, double* fLChRslt);
+bool_t ColorMath_LChToDELCh(const CIELCHCOORD* pLChTrial, const CIELCHCOORD* pLChStandard, double* pDELCh);
+bool_t ColorMath_LChToDHAndDE(const CIELCHCOORD* pLChTrial, const CIELCHCOORD* pLChStandard, double* pDH,
+                              double* pDE);
+// CMC(l:c) weighted by the standard; 999.0 and false when it cannot be computed.
+bool_t ColorMath_LabToDEcmc(const CIELABCOORD* pLabTrial, const CIELABCOORD* pLabStandard, double l, double c,
+                            double* pDEcmc);
+bool_t ColorMath_LChToDEcmc(const CIELCHCOORD* pLChTrial, const CIELCHCOORD* pLChStandard, double l, double c,
+                            CIELCHCOORD* pDeltaLCh, double* pDEcmc);
+bool_t ColorMath_LabToDE94(const CIELABCOORD* pLabTrial, const CIELABCOORD* pLabStandard, double Kl, double Kc,
+                           double* pDE94);
+bool_t ColorMath_LChToDE94(const CIELCHCOORD* pLChTrial, const CIELCHCOORD* pLChStandard, double Kl, double Kc,
+                           CIELCHCOORD* pLChDelta, double* pDE94);
+// kL, kC, kH below 0.001 are raised to it; kH is raised in fLChCoef too.
+double ColorMath_CalcCIE94(const double* fLabSmp, const double* fLabStd, const double* fLChSmp,
+                           const double* fLChStd, double* fLChCoef, double* pDeltaLCh, bool bNoStd);
+// The hue mean is the plain average of the two hues, also for hues more
+// than 180 degrees apart.
+double ColorMath_CalcCIE2000(const double* fLabSmp, const double* fLabStd, const double* fLChSmp,
+                             const double* fLChStd, const double* fLChCoef);
+double ColorMath_CalcDIN6175(const double* fLabSmp, const double* fLabStd, const double* fLChSmp,
+                             const double* fLChStd, double Angle, double gl, double ga, double gb, double gc,
+                             double gh);
+double ColorMath_CalcDIN6175c(const double* fLabSmp, const double* fLabStd, const double* fLChSmp,
+                              const double* fLChStd, double Angle);
+double ColorMath_CalcDIN6175p(const double* fLabSmp, const double* fLabStd, const double* fLChSmp,
+                              const double* fLChStd, double Angle);
+
+// ---- Indices of one spectrum or two ------------------------------------------------
+
+typedef struct _GANZ {
+    double Whiteness;
+    double Tint;
+} GANZ;
+
+extern const float asISOR457_Filter[NUM_WAVELENGTHS];
+
+bool_t ColorMath_ReflToWhiteE313_73IQC(const double* pRefl, int illumobsnr, double* pWhite);
+bool_t ColorMath_ReflToWhiteE313_98(const double* pRefl, int illumobsnr, double* pWhite);
+bool_t ColorMath_ReflToWhiteE313_05(const double* pRefl, int illumobsnr, double* pWhite);
+bool_t ColorMath_CIEYxyToWhiteE313_98(const CIEYXYCOORD* pYxy, int illumobsnr, double* pWhite);
+bool_t ColorMath_CIEYxyToWhiteE313_05(const CIEYXYCOORD* pYxy, int illumobsnr, double* pWhite);
+bool_t ColorMath_XYZtoWhiteE313_98(const XYZCOORD* pXYZ, int illumobsnr, double* pWhite);
+bool_t ColorMath_ReflToWhiteE313_Regensdorf(const double* pRefl, int illumobsnr, double* pWhite);
+bool_t ColorMath_ReflToWhiteBerger(const double* pRefl, int illumobsnr, double* pWhite);
+bool_t ColorMath_ReflToWhiteBergerIQC(const double* pRefl, int illumobsnr, double* pWhite);
+bool_t ColorMath_ReflToWhiteTaubeIQC(const double* pRefl, int illumobsnr, double* pWhite);
+bool_t ColorMath_ReflToWhiteHunterIQC(const double* pRefl, int illumobsnr, double* pWhite);
+bool_t ColorMath_ReflToWhiteStensby(const double* pRefl, int illumobsnr, double* pWhite);
+bool_t ColorMath_ReflToWhiteStensbyIQC(const double* pRefl, int illumobsnr, double* pWhite);
+bool_t ColorMath_ReflToWhiteGanzGriessner(const double* pRefl, int illumobsnr, GANZ* pWhiteGanz);
+bool_t ColorMath_ReflToWhiteISO_R457(const double* pRefl, double* pWhite);
+
+bool_t ColorMath_ReflToYellowE313_98(const double* pRefl, int illumobsnr, double* pYellow);
+bool_t ColorMath_XYZtoYellowE313_98(const XYZCOORD* pXYZ, int illumobsnr, double* pYellow);
+bool_t ColorMath_ReflToYellowE313_73IQC(const double* pRefl, int illumobsnr, double* pYellow);
+bool_t ColorMath_ReflToYellowE313_Regensdorf(const double* pRefl, int illumobsnr, double* pYellow);
+bool_t ColorMath_ReflToYellowD1925(const double* pRefl, int illumobsnr, double* pYellow);
+bool_t ColorMath_ReflToYellowD1925IQC(const double* pRefl, int illumobsnr, double* pYellow);
+bool_t ColorMath_ReflToCIETintYellow(const double* pRefl, int illumobsnr, double* pTint);
+
+bool_t ColorMath_ReflToMetamerism(const double* pStdRefls, const double* pSampRefls, int IllObs1, int IllObs2,
+                                  double* pMetamerism);
+bool_t ColorMath_ReflToDIN6172(const double* pStdRefls, const double* pSampRefls, int IllObs1, int IllObs2,
+                               double* pMetamerism);
+bool_t ColorMath_ReflToABErrorWeights(const double* reflsStd, const double* reflsTrial, int illumobsnr,
+                                      double* pAErrWeights, double* pBErrWeights);
+// Spectra in percent from here on.
+bool_t ColorMath_ReflToOpacity(const double* pafCOBRefls, const double* pafCOWRefls, int illumobsnr,
+                               double* pfOpacity);
+bool_t ColorMath_ReflToFullColorAtHide(const double* pafWhiteRefls, const double* pafCOWRefls,
+                                       const double* pafCOBRefls, double fk1, double fk2, double* pafCAHRefls);
+bool_t ColorMath_ReflToStrengthApt(const double* pfStdRefls, const double* pfSampleRefls, double* pfApparentStr);
+bool_t ColorMath_ReflToStrengthChr(const double* pfStdRefls, const double* pfSampleRefls, double* pfChromStr,
+                                   int* piWaveLength);
+bool_t ColorMath_ReflToStrengthTri(const double* pfStdRefls, const double* pfSampleRefls, double* pfTristStr);
+bool_t ColorMath_StrengthAtMinDE(const double* pafSampleRefl, const double* pafStdRefl, double* pafAdjustedRefl,
+                                 double* pfNewStrength);
+// Ratings "5", "4-5" ... "1"; each buffer holds at least four characters.
+bool_t ColorMath_ReflToGrayScale(const double* pSmpRefls, const double* pStdRefls, char* Stain, char* Color);
+bool_t ColorMath_IsChromatic(const double* refls, int illumobsnr);
+void ColorMath_GetAChromaticConstants(double* pLHi, double* pLLo, double* pCHi, double* pCLo);
+bool_t ColorMath_ReflToGloss60(const double* pReflInc, const double* pReflExc, int illumobsnr,
+                               const double* pCoeffs, double* pGloss);
+double ColorMath_FindArea(const double* dRefls, int nStartIndex, int nEndIndex);
+
 #endif // COLORMATH_H
