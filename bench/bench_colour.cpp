@@ -1,6 +1,7 @@
 // Speed of the colour path every patch on screen takes (spectrum -> XYZ ->
 // screen RGB) and of XYZ -> L*a*b*, with littleCMS's cmsXYZ2Lab on the same
-// inputs as the outside reference for both time and values.
+// inputs as the outside reference for both time and values; and CIEDE2000
+// beside littleCMS's cmsCIE2000DeltaE.
 // Prints nanoseconds per call, the median of repeated runs, timed on the
 // thread's CPU clock so that time spent descheduled on a busy machine is
 // not counted.
@@ -121,6 +122,37 @@ int main()
         g_sink = acc;
     }, kSpectra);
 
+    // CIEDE2000 between neighbouring colours of the set, ours and littleCMS's.
+    std::vector<CIELABCOORD> labs(kSpectra);
+    std::vector<CIELCHCOORD> lchs(kSpectra);
+    for (int s = 0; s < kSpectra; ++s) {
+        ColorMath_XYZToCIELab(&xyz[size_t(s)], pair, &labs[size_t(s)]);
+        ColorMath_CIELabToCIELCH(&labs[size_t(s)], &lchs[size_t(s)]);
+    }
+    const double kOnes[3] = {1.0, 1.0, 1.0};
+    const double tDE2000 = timeIt([&] {
+        double acc = 0;
+        for (int s = 1; s < kSpectra; ++s) {
+            const CIELABCOORD& a = labs[size_t(s)];
+            const CIELABCOORD& b = labs[size_t(s - 1)];
+            const CIELCHCOORD& ca = lchs[size_t(s)];
+            const CIELCHCOORD& cb = lchs[size_t(s - 1)];
+            const double la[3] = {a.L, a.a, a.b}, lb[3] = {b.L, b.a, b.b};
+            const double ha[3] = {ca.L, ca.C, ca.h}, hb[3] = {cb.L, cb.C, cb.h};
+            acc += ColorMath_CalcCIE2000(la, lb, ha, hb, kOnes);
+        }
+        g_sink = acc;
+    }, kSpectra - 1);
+    const double tCms2000 = timeIt([&] {
+        double acc = 0;
+        for (int s = 1; s < kSpectra; ++s) {
+            const cmsCIELab a = {labs[size_t(s)].L, labs[size_t(s)].a, labs[size_t(s)].b};
+            const cmsCIELab b = {labs[size_t(s - 1)].L, labs[size_t(s - 1)].a, labs[size_t(s - 1)].b};
+            acc += cmsCIE2000DeltaE(&a, &b, 1.0, 1.0, 1.0);
+        }
+        g_sink = acc;
+    }, kSpectra - 1);
+
     // Largest difference from littleCMS, per coordinate and as a distance.
     double dL = 0, da = 0, db = 0, dE = 0;
     for (const auto& v : xyz) {
@@ -141,6 +173,9 @@ int main()
     std::printf("  ColorMath_XYZToCIELab    %7.1f ns/call\n", tLab);
     std::printf("  cmsXYZ2Lab (littleCMS)   %7.1f ns/call\n", tCms);
     std::printf("  XYZToCIELab / cmsXYZ2Lab %7.2f x time\n", tLab / tCms);
+    std::printf("  ColorMath_CalcCIE2000    %7.1f ns/call\n", tDE2000);
+    std::printf("  cmsCIE2000DeltaE         %7.1f ns/call\n", tCms2000);
+    std::printf("  CalcCIE2000 / cmsCIE2000DeltaE %7.2f x time\n", tDE2000 / tCms2000);
     std::printf("  largest difference from littleCMS: dL %.2e  da %.2e  db %.2e  dE %.2e\n", dL, da, db, dE);
     return 0;
 }
