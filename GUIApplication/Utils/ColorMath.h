@@ -80,6 +80,8 @@ extern const unsigned char FGAMMA[1000];
 // cyan, magenta, yellow. A row sums to about 100,000.
 enum { DEN_WEIGHT_STATUSES = 4, DEN_WEIGHT_RESPONSES = 4 };
 extern const int32_t den_weight[DEN_WEIGHT_STATUSES * DEN_WEIGHT_RESPONSES * NUM_WAVELENGTHS];
+// Status M in the same form, a table of its own.
+extern const int32_t den_weight_M[DEN_WEIGHT_RESPONSES * NUM_WAVELENGTHS];
 
 // Hunter Lab Ka and Kb per illuminant/observer pair.
 extern const float s_HunterKa[eILLUM_OBS_NumOf];
@@ -230,5 +232,95 @@ void ColorMath_GetAChromaticConstants(double* pLHi, double* pLLo, double* pCHi, 
 bool_t ColorMath_ReflToGloss60(const double* pReflInc, const double* pReflExc, int illumobsnr,
                                const double* pCoeffs, double* pGloss);
 double ColorMath_FindArea(const double* dRefls, int nStartIndex, int nEndIndex);
+
+// ---- Density and print measures ------------------------------------------------------
+// Spectra in percent. Densities come from the status rows of den_weight (A,
+// E, T) and den_weight_M (M). Status I has no published data and gives
+// -999.0 with false; the statuses without rows (Hi-Fi, Hexachrome and the
+// x forms) give false and never read a table.
+
+typedef enum _DENSITY_STATUS {
+    DENSITY_STATUS_A = 0,
+    DENSITY_STATUS_E = 1,
+    DENSITY_STATUS_I = 2,
+    DENSITY_STATUS_t = 3,
+    DENSITY_SPECTRAL = 4,
+    DENSITY_SPECTRAL_X = 5,
+    DENSITY_STATUS_HIFI = 6,
+    DENSITY_STATUS_HEXACHROME = 7,
+    DENSITY_STATUS_Tx = 8,
+    DENSITY_STATUS_Ax = 9,
+    DENSITY_STATUS_Ex = 10,
+    DENSITY_STATUS_G = 11,
+    DENSITY_STATUS_M = 12,
+    DENSITY_STATUS_Axt = 13,
+    DENSITY_STATUS_Mx = 14,
+    DENSITY_STATUS_NumOf = 15
+} DENSITY_STATUS;
+
+typedef enum _DENSITY_RESPONSE {
+    VISUAL_RESPONSE = 0,
+    CYAN_RESPONSE = 1,
+    MAGENTA_RESPONSE = 2,
+    YELLOW_RESPONSE = 3,
+    HIFI_RED_RESPONSE = 4,
+    HIFI_GREEN_RESPONSE = 5,
+    HIFI_BLUE_RESPONSE = 6,
+    HEX_WEIGHT1_RESPONSE = 7,
+    HEX_WEIGHT2_RESPONSE = 8,
+    INVALID_RESPONSE = 9
+} DENSITY_RESPONSE;
+
+typedef struct _DENSITYSTRUCT {
+    double Density[HEX_WEIGHT2_RESPONSE + 1];
+} DENSITYSTRUCT;
+
+int ColorMath_GetNumStatuses();
+int ColorMath_GetNumResponses();
+int ColorMath_GetNumStatusResponses(int status);
+const char* ColorMath_GetStatusName(int status);
+const char* ColorMath_GetResponseName(int response);
+const char* ColorMath_GetStatusResponseName(int status, int response);
+int ColorMath_StatusNameToIndex(const char* name);
+int ColorMath_ResponseNameToIndex(const char* name);
+
+bool_t ColorMath_ReflToReflDensity(const double* pRefl, int status, int filter, double* pDensity);
+bool_t ColorMath_ReflToDensity(const double* r, const double* PaperRefls, int status, int filter, double* pDensity);
+bool_t ColorMath_ReflToDensities(const double* pRefl, const double* PaperRefls, int status, DENSITYSTRUCT* pDensities);
+double ColorMathHelper_CalculateSpectralDensity(double dRefl);
+bool_t ColorMath_CalculateSpectralXDensity(const double* pRefl, const double* PaperRefls, double* pDensity);
+// The dominant response, or for spectral density the wavelength in nm; -1
+// when there is none.
+int ColorMath_DetermineDensityResponse(const double* pRefls, int status, const double* pPaperRefls);
+bool_t ColorMathHelper_AdjustForPaperRefls(const double* pRefls, const double* pPaperRefls, double* r);
+bool_t ColorMathHelper_FindDensityMin(const DENSITYSTRUCT* pDensities, double* pMinDen, int* pRespMin, bool fUseVisual);
+bool_t ColorMathHelper_FindDensityMax(const DENSITYSTRUCT* pDensities, double* pMaxDen, int* pRespMax, bool fUseVisual);
+
+bool_t ColorMath_DensityToTrap(double O, double S, double U, double* pTrap);
+bool_t ColorMath_DensityToPreucilTrap(double O, double S, double U, double* pTrap);
+bool_t ColorMath_DensityToBrunnerTrap(double O, double S, double U, double* pTrap);
+bool_t ColorMath_DensityToRitzTrap(double O, double S, double U, double* pTrap);
+bool_t ColorMath_DensityToNewsTrap(double O, double S, double U, double fDMax, double* pTrap);
+bool_t ColorMath_ReflToTrap(const double* pReflTop, const double* pReflBottom, const double* pReflOverprint,
+                            const double* ReflPaper, int status, int filter, double* pTrap);
+
+bool_t ColorMath_DensityToHueGray(double DenCyan, double DenMagenta, double DenYellow, double* pGrayness,
+                                  double* pHueError);
+bool_t ColorMath_DensityToHueGrayDirection(double DenCyan, double DenMagenta, double DenYellow, double* pGrayness,
+                                           double* pHueError, int* eRetDir);
+bool_t ColorMath_ReflToHueGray(const double* pRefl, const double* PaperRefls, int status, double* pGrayness,
+                               double* pHueError);
+bool_t ColorMath_CMYToCast(const double* pCMY, double* pCast);
+bool_t ColorMath_ReflToBrightness(const double* Refl, double* pBrightness);
+
+bool_t ColorMath_DensityToDotArea(double dDenSolid, double dDenTint, double dCompensationFactor, double* pdDotArea);
+bool_t ColorMath_DensityFromDotArea(double dDenSolid, double dDotArea, double dCompensationFactor, double* pdDensity);
+bool_t ColorMath_DensityToPrintContrast(double dDenSolid, double dDenTint, double* pPrintContrast);
+bool_t ColorMath_FindNFactor(const double* pDenPaper, const double* pDenSolid, const double* pDenTint,
+                             double* pNFactor);
+bool_t ColorMath_CombineInkColors(const double* pInk1Refls, const double* pInk2Refls, double* pCombinedRefls);
+bool_t ColorMath_GetNormalizedDensityWeights(int nStatus, int nResponse, double* pWeights, int* pStartWaveLen,
+                                             int* pPeakWavelen, int* pEndWavelen);
+bool_t ColorMath_DensitytoIntegratedRefl(double dDen, int status, int filter, double* pRefl);
 
 #endif // COLORMATH_H

@@ -6,7 +6,8 @@
 // weights for 400-700 nm summing to 100,000: the product made linear
 // (10^(v - 5)) and scaled over the instrument's range. The visual response
 // is ISO visual for every status. No public data exist for status I; its
-// rows are 0 and mark that status as unavailable.
+// rows are 0 and mark that status as unavailable. Status M, which the data
+// have, stands in a table of its own in the same form.
 
 #include "Utils/ColorMath.h"
 
@@ -89,6 +90,29 @@ const int32_t den_weight[DEN_WEIGHT_STATUSES * DEN_WEIGHT_RESPONSES * NUM_WAVELE
     // status T, yellow
        846,   2395,   5640,   8458,  11568,  13251,  14101,  13685,
      11974,   9167,   5640,   2537,    705,     28,      6,      0,
+         0,      0,      0,      0,      0,      0,      0,      0,
+         0,      0,      0,      0,      0,      0,      0
+};
+
+const int32_t den_weight_M[DEN_WEIGHT_RESPONSES * NUM_WAVELENGTHS] = {
+    // status M, visual
+         0,      2,      8,     26,     72,    116,    210,    361,
+       622,   1040,   1787,   3084,   4765,   6325,   7605,   8572,
+      9228,   9464,   9228,   8552,   7552,   6355,   5094,   3708,
+      2565,   1637,    975,    531,    292,    146,     75,
+    // status M, cyan
+         0,      0,      0,      0,      0,      0,      0,      0,
+         0,      0,      0,      0,      0,      0,      0,      0,
+         0,      0,      0,      0,      0,      0,     46,  10875,
+     36092,  28603,  13659,   6448,   2707,   1118,    453,
+    // status M, magenta
+         0,      0,      0,      0,      0,      0,      0,      3,
+        36,    321,   1426,   4188,   9463,  16674,  22389,  22133,
+     14724,   6427,   1841,    333,     39,      3,      0,      0,
+         0,      0,      0,      0,      0,      0,      0,
+    // status M, yellow
+         0,     31,   3194,  10600,  18378,  24734,  22300,  13687,
+      5449,   1369,    242,     18,      0,      0,      0,      0,
          0,      0,      0,      0,      0,      0,      0,      0,
          0,      0,      0,      0,      0,      0,      0
 };

@@ -111,6 +111,8 @@ long long unwrapX(long long stored);
 // ISO 5-3 spectral product at 400-700 nm made linear and scaled to sum to
 // 100,000. Status I has no public data: its rows are left 0.
 std::vector<long long> densityWeights(const std::string& dataDir);
+// The four rows of status M, in the same form.
+std::vector<long long> densityWeightsStatusM(const std::string& dataDir);
 
 // The generated sources, byte for byte as committed.
 std::string weightTablesSource(const std::string& dataDir);

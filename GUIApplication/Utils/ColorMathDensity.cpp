@@ -1,0 +1,620 @@
+// Densitometry and print measures: density by status, spectral density,
+// trapping, hue error and greyness, dot area, print contrast. Spectra are in
+// percent. Only statuses with weights (A, E, T and M) read a table; every
+// other status is refused before any table is touched.
+
+#include "Utils/ColorMath.h"
+
+#include <cmath>
+#include <cstring>
+
+namespace {
+
+const double kErrorValue = -999.0;
+const double kSpectralXWeights[5] = {0.1, 0.5, 1.0, 0.5, 0.1};
+
+double log10S(double v) { return double(log10f(float(v))); }
+double pow10S(double v) { return double(powf(10.0f, float(v))); }
+
+// The 31 weights of a status and response, or null where we have none.
+const int32_t* weightRow(int status, int response)
+{
+    if (response < VISUAL_RESPONSE || response > YELLOW_RESPONSE)
+        return nullptr;
+    switch (status) {
+    case DENSITY_STATUS_A: return den_weight + 0 * 124 + response * NUM_WAVELENGTHS;
+    case DENSITY_STATUS_E: return den_weight + 1 * 124 + response * NUM_WAVELENGTHS;
+    case DENSITY_STATUS_t: return den_weight + 3 * 124 + response * NUM_WAVELENGTHS;
+    case DENSITY_STATUS_M: return den_weight_M + response * NUM_WAVELENGTHS;
+    default: return nullptr; // status I has no data; the others have no rows
+    }
+}
+
+double weightedSum(const double* refl, const int32_t* row)
+{
+    double sum = 0.0;
+    for (int i = 0; i < NUM_WAVELENGTHS; ++i)
+        sum += refl[i] * double(row[i]);
+    return sum;
+}
+
+// Plain status density, -log10 of the weighted reflectance.
+bool statusDensity(const double* refl, int status, int filter, double* pDensity)
+{
+    const int32_t* row = weightRow(status, filter);
+    if (!row) {
+        if (status == DENSITY_STATUS_I)
+            *pDensity = kErrorValue;
+        return false;
+    }
+    double r = weightedSum(refl, row) * 1e-7;
+    if (r < 0.00001)
+        r = 0.00001;
+    *pDensity = -log10S(r);
+    return true;
+}
+
+double clampDensity(double d)
+{
+    return d < 0.0 ? 0.0 : d > 5.0 ? 5.0 : d;
+}
+
+double weightedRefl(const double* refl, int index)
+{
+    double sum = 0.0;
+    for (int k = -2; k <= 2; ++k) {
+        const int i = index + k;
+        if (i >= 0 && i < NUM_WAVELENGTHS)
+            sum += refl[i] * kSpectralXWeights[k + 2];
+    }
+    return sum;
+}
+
+double specialDensity(const double* refl, int index, const double* weights, int n)
+{
+    double sum = 0.0, wsum = 0.0;
+    for (int k = 0; k < n; ++k) {
+        const int i = index - n / 2 + k;
+        if (i >= 0 && i < NUM_WAVELENGTHS) {
+            sum += refl[i] * weights[k];
+            wsum += weights[k];
+        }
+    }
+    if (sum <= 0.0 || wsum <= 0.0)
+        return 0.0;
+    return -log10S(sum / (wsum * 100.0));
+}
+
+// The index of the strongest absorption for spectral X: among the local
+// minima of the smoothed reflectance, the one whose absorbing band (values
+// within 2 percent of its minimum) is widest; the deepest wins a tie.
+int spectralXIndex(const double* refl)
+{
+    double smoothed[NUM_WAVELENGTHS];
+    for (int i = 0; i < NUM_WAVELENGTHS; ++i)
+        smoothed[i] = weightedRefl(refl, i);
+    // The weights of the smoothing add up to 2.2.
+    const double band = 2.0 * 2.2;
+    int best = -1, bestWidth = -1;
+    for (int i = 2; i <= NUM_WAVELENGTHS - 3; ++i) {
+        if (smoothed[i] > smoothed[i - 1] || smoothed[i] > smoothed[i + 1])
+            continue;
+        int width = 1;
+        for (int j = i - 1; j >= 0 && smoothed[j] - smoothed[i] <= band; --j)
+            ++width;
+        for (int j = i + 1; j < NUM_WAVELENGTHS && smoothed[j] - smoothed[i] <= band; ++j)
+            ++width;
+        if (width > bestWidth || (width == bestWidth && smoothed[i] < smoothed[best])) {
+            best = i;
+            bestWidth = width;
+        }
+    }
+    return best;
+}
+
+bool hasRows(int status)
+{
+    return weightRow(status, VISUAL_RESPONSE) != nullptr;
+}
+
+} // namespace
+
+// ---- Names ---------------------------------------------------------------------------
+
+int ColorMath_GetNumStatuses()
+{
+    return DENSITY_STATUS_NumOf;
+}
+
+int ColorMath_GetNumResponses()
+{
+    return 4;
+}
+
+int ColorMath_GetNumStatusResponses(int status)
+{
+    switch (status) {
+    case DENSITY_STATUS_A:
+    case DENSITY_STATUS_E:
+    case DENSITY_STATUS_I:
+    case DENSITY_STATUS_t: return 4;
+    case DENSITY_STATUS_HIFI: return 7;
+    case DENSITY_STATUS_HEXACHROME: return 6;
+    default: return 0;
+    }
+}
+
+const char* ColorMath_GetStatusName(int)
+{
+    static const char empty[1] = {0};
+    return empty;
+}
+
+const char* ColorMath_GetResponseName(int)
+{
+    return ColorMath_GetStatusName(0);
+}
+
+const char* ColorMath_GetStatusResponseName(int, int)
+{
+    return ColorMath_GetStatusName(0);
+}
+
+int ColorMath_StatusNameToIndex(const char* name)
+{
+    if (!name)
+        return -1;
+    static const struct { const char* name; int index; } names[] = {
+        {"Status A", 0}, {"A", 0}, {"Status E", 1}, {"E", 1}, {"Status I", 2}, {"I", 2},
+        {"Status T", 3}, {"T", 3}, {"Spectral", 4}, {"S", 4}, {"Spectral X", 5}, {"X", 5},
+        {"Hi-Fi", 6}, {"HIFI", 6}, {"H", 6}, {"Hexachrome", 7}, {"HEX", 7}, {"C", 7},
+    };
+    for (const auto& n : names) {
+        if (std::strcmp(name, n.name) == 0)
+            return n.index;
+    }
+    return -1;
+}
+
+int ColorMath_ResponseNameToIndex(const char* name)
+{
+    if (!name)
+        return -1;
+    static const struct { const char* name; int index; } names[] = {
+        {"Visual", 0}, {"V", 0}, {"Cyan", 1}, {"C", 1}, {"Magenta", 2}, {"M", 2}, {"Yellow", 3}, {"Y", 3},
+        {"Red", 4}, {"R", 4}, {"Green", 5}, {"G", 5}, {"Blue", 6}, {"B", 6}, {"Hex Orange", 7}, {"O", 7},
+        {"Hex Green", 8}, {"E", 8},
+    };
+    for (const auto& n : names) {
+        if (std::strcmp(name, n.name) == 0)
+            return n.index;
+    }
+    return -1;
+}
+
+// ---- Densities ---------------------------------------------------------------------------
+
+bool_t ColorMath_ReflToReflDensity(const double* pRefl, int status, int filter, double* pDensity)
+{
+    if (!pRefl || !pDensity || status < 0 || status >= DENSITY_STATUS_NumOf || filter < 0 || filter > 3)
+        return false;
+    const int32_t* row = weightRow(status, filter);
+    if (!row)
+        return false;
+    double r = weightedSum(pRefl, row) * 0.00001;
+    if (r < double(0.001f))
+        r = double(0.001f);
+    *pDensity = r;
+    return true;
+}
+
+double ColorMathHelper_CalculateSpectralDensity(double dRefl)
+{
+    if (dRefl < 0.00001)
+        dRefl = 0.00001;
+    return -log10S(dRefl / 100.0);
+}
+
+bool_t ColorMath_CalculateSpectralXDensity(const double* pRefl, const double* PaperRefls, double* pDensity)
+{
+    if (!pRefl || !pDensity)
+        return false;
+    const int index = spectralXIndex(pRefl);
+    if (index < 0)
+        return false;
+    double d = specialDensity(pRefl, index, kSpectralXWeights, 5);
+    if (PaperRefls)
+        d -= specialDensity(PaperRefls, index, kSpectralXWeights, 5);
+    *pDensity = clampDensity(d);
+    return true;
+}
+
+bool_t ColorMath_ReflToDensity(const double* r, const double* PaperRefls, int status, int filter, double* pDensity)
+{
+    if (!r || !pDensity || status < 0 || status >= DENSITY_STATUS_NumOf)
+        return false;
+    if (status == DENSITY_SPECTRAL) {
+        if (filter < 400 || filter > 700)
+            return false;
+        const int index = (filter - 400) / 10;
+        double d = ColorMathHelper_CalculateSpectralDensity(r[index]);
+        if (PaperRefls)
+            d -= ColorMathHelper_CalculateSpectralDensity(PaperRefls[index]);
+        *pDensity = clampDensity(d);
+        return true;
+    }
+    if (status == DENSITY_SPECTRAL_X)
+        return ColorMath_CalculateSpectralXDensity(r, PaperRefls, pDensity);
+    if (filter < 0 || filter > 3)
+        return false;
+    double d = 0.0;
+    if (!statusDensity(r, status, filter, &d)) {
+        if (status == DENSITY_STATUS_I)
+            *pDensity = kErrorValue;
+        return false;
+    }
+    if (PaperRefls) {
+        double paper = 0.0;
+        statusDensity(PaperRefls, status, filter, &paper);
+        d -= paper;
+    }
+    *pDensity = d;
+    return true;
+}
+
+bool_t ColorMath_ReflToDensities(const double* pRefl, const double* PaperRefls, int status, DENSITYSTRUCT* pDensities)
+{
+    if (!pRefl || !pDensities)
+        return false;
+    std::memset(pDensities, 0, sizeof *pDensities);
+    if (status == DENSITY_SPECTRAL) {
+        const int nm = ColorMath_DetermineDensityResponse(pRefl, status, PaperRefls);
+        if (nm < 400)
+            return false;
+        pDensities->Density[1] = nm;
+        return ColorMath_ReflToDensity(pRefl, PaperRefls, status, nm, &pDensities->Density[0]);
+    }
+    if (status == DENSITY_SPECTRAL_X)
+        return ColorMath_ReflToDensity(pRefl, PaperRefls, status, 0, &pDensities->Density[0]);
+    if (!hasRows(status))
+        return false;
+    for (int response = VISUAL_RESPONSE; response <= YELLOW_RESPONSE; ++response) {
+        if (!ColorMath_ReflToDensity(pRefl, PaperRefls, status, response, &pDensities->Density[response]))
+            return false;
+    }
+    return true;
+}
+
+bool_t ColorMathHelper_AdjustForPaperRefls(const double* pRefls, const double* pPaperRefls, double* r)
+{
+    if (!pRefls || !pPaperRefls || !r)
+        return false;
+    for (int i = 0; i < NUM_WAVELENGTHS; ++i) {
+        const double paper = pPaperRefls[i] > 0.0 ? log10S(100.0 / pPaperRefls[i]) : 5.0;
+        const double ink = pRefls[i] > 0.0 ? log10S(100.0 / pRefls[i]) : 5.0;
+        const double d = ink - paper;
+        const double factor = d <= 0.5 ? 2.0 : 1.0;
+        r[i] = 100.0 / pow10S(factor * d + ink);
+    }
+    return true;
+}
+
+bool_t ColorMathHelper_FindDensityMin(const DENSITYSTRUCT* pDensities, double* pMinDen, int* pRespMin, bool fUseVisual)
+{
+    if (!pDensities || !pMinDen || !pRespMin)
+        return false;
+    double best = 100.0;
+    int resp = -1;
+    for (int i = fUseVisual ? 0 : 1; i <= HEX_WEIGHT2_RESPONSE; ++i) {
+        const double d = pDensities->Density[i];
+        if (d != 0.0 && d < best) {
+            best = d;
+            resp = i;
+        }
+    }
+    *pMinDen = best;
+    *pRespMin = resp;
+    return resp >= 0;
+}
+
+bool_t ColorMathHelper_FindDensityMax(const DENSITYSTRUCT* pDensities, double* pMaxDen, int* pRespMax, bool fUseVisual)
+{
+    if (!pDensities || !pMaxDen || !pRespMax)
+        return false;
+    double best = 0.0;
+    int resp = -1;
+    for (int i = fUseVisual ? 0 : 1; i <= HEX_WEIGHT2_RESPONSE; ++i) {
+        const double d = pDensities->Density[i];
+        if (d != 0.0 && d > best) {
+            best = d;
+            resp = i;
+        }
+    }
+    *pMaxDen = best;
+    *pRespMax = resp;
+    return resp >= 0;
+}
+
+int ColorMath_DetermineDensityResponse(const double* pRefls, int status, const double* pPaperRefls)
+{
+    if (!pRefls || status < 0 || status >= DENSITY_STATUS_NumOf)
+        return -1;
+    double adjusted[NUM_WAVELENGTHS];
+    const double* refl = pRefls;
+    if (pPaperRefls && ColorMathHelper_AdjustForPaperRefls(pRefls, pPaperRefls, adjusted))
+        refl = adjusted;
+    if (status == DENSITY_SPECTRAL) {
+        int best = 2;
+        for (int i = 3; i <= 30; ++i) {
+            if (ColorMathHelper_CalculateSpectralDensity(refl[i]) > ColorMathHelper_CalculateSpectralDensity(refl[best]))
+                best = i;
+        }
+        return 400 + 10 * best;
+    }
+    // The visual response is the same for every status: take status A's.
+    double visual = 0.0;
+    if (!ColorMath_ReflToReflDensity(refl, DENSITY_STATUS_A, VISUAL_RESPONSE, &visual) || visual > 80.0)
+        return -1;
+    double fraction[NUM_WAVELENGTHS];
+    for (int i = 0; i < NUM_WAVELENGTHS; ++i)
+        fraction[i] = refl[i] / 100.0;
+    if (!ColorMath_IsChromatic(fraction, D65_10))
+        return -1;
+    if (status == DENSITY_SPECTRAL_X)
+        return 0;
+    DENSITYSTRUCT densities;
+    if (!ColorMath_ReflToDensities(refl, nullptr, status, &densities))
+        return -1;
+    double maxDen = 0.0;
+    int resp = -1;
+    ColorMathHelper_FindDensityMax(&densities, &maxDen, &resp, false);
+    return resp;
+}
+
+// ---- Trap -------------------------------------------------------------------------------
+
+bool_t ColorMath_DensityToTrap(double O, double S, double U, double* pTrap)
+{
+    if (!pTrap || S == 0.0)
+        return false;
+    *pTrap = (O - U) / S * 100.0;
+    return true;
+}
+
+bool_t ColorMath_DensityToPreucilTrap(double O, double S, double U, double* pTrap)
+{
+    return ColorMath_DensityToTrap(O, S, U, pTrap);
+}
+
+bool_t ColorMath_DensityToBrunnerTrap(double O, double S, double U, double* pTrap)
+{
+    if (!pTrap || S == 0.0)
+        return false;
+    const double d = 1.0 - pow10S(-(S + U));
+    if (d == 0.0)
+        return false;
+    *pTrap = (1.0 - pow10S(-O)) * 100.0 / d;
+    return true;
+}
+
+bool_t ColorMath_DensityToRitzTrap(double O, double S, double U, double* pTrap)
+{
+    if (!pTrap || S == 0.0)
+        return false;
+    const double d = 1.0 - pow10S(-S);
+    if (d == 0.0)
+        return false;
+    *pTrap = (1.0 - pow10S(-(O - U))) * 100.0 / d;
+    return true;
+}
+
+bool_t ColorMath_DensityToNewsTrap(double O, double S, double U, double fDMax, double* pTrap)
+{
+    if (!pTrap || S == 0.0 || fDMax - S == 0.0 || fDMax - O == 0.0)
+        return false;
+    const double d = double(logf(float(S / (fDMax - S) + 1.0)));
+    if (d == 0.0)
+        return false;
+    *pTrap = double(logf(float((O - U) / (fDMax - O) + 1.0))) * 100.0 / d;
+    return true;
+}
+
+bool_t ColorMath_ReflToTrap(const double* pReflTop, const double* pReflBottom, const double* pReflOverprint,
+                            const double* ReflPaper, int status, int filter, double* pTrap)
+{
+    double S = 0.0, U = 0.0, O = 0.0;
+    if (!pReflTop || !pReflBottom || !pReflOverprint || !pTrap
+        || !ColorMath_ReflToDensity(pReflTop, ReflPaper, status, filter, &S)
+        || !ColorMath_ReflToDensity(pReflBottom, ReflPaper, status, filter, &U)
+        || !ColorMath_ReflToDensity(pReflOverprint, ReflPaper, status, filter, &O))
+        return false;
+    return ColorMath_DensityToTrap(O, S, U, pTrap);
+}
+
+// ---- Hue error, greyness, cast ----------------------------------------------------------------
+
+bool_t ColorMath_DensityToHueGray(double DenCyan, double DenMagenta, double DenYellow, double* pGrayness,
+                                  double* pHueError)
+{
+    if (!pGrayness || !pHueError)
+        return false;
+    const double maxD = std::fmax(DenCyan, std::fmax(DenMagenta, DenYellow));
+    const double minD = std::fmin(DenCyan, std::fmin(DenMagenta, DenYellow));
+    const double mid = DenCyan + DenMagenta + DenYellow - maxD - minD;
+    *pGrayness = maxD == 0.0 ? 100.0 : minD / maxD * 100.0;
+    *pHueError = maxD == minD ? 100.0 : (mid - minD) / (maxD - minD) * 100.0;
+    return true;
+}
+
+bool_t ColorMath_DensityToHueGrayDirection(double DenCyan, double DenMagenta, double DenYellow, double* pGrayness,
+                                           double* pHueError, int* eRetDir)
+{
+    if (!eRetDir || !ColorMath_DensityToHueGray(DenCyan, DenMagenta, DenYellow, pGrayness, pHueError))
+        return false;
+    if (DenCyan >= DenMagenta && DenCyan >= DenYellow)
+        *eRetDir = DenYellow > DenMagenta ? 9 : 0;
+    else if (DenMagenta >= DenYellow)
+        *eRetDir = DenYellow > DenCyan ? 8 : 4;
+    else
+        *eRetDir = DenMagenta > DenCyan ? 1 : 5;
+    return true;
+}
+
+bool_t ColorMath_ReflToHueGray(const double* pRefl, const double* PaperRefls, int status, double* pGrayness,
+                               double* pHueError)
+{
+    if (status == DENSITY_SPECTRAL_X)
+        return false;
+    if (status == DENSITY_STATUS_HIFI || status == DENSITY_STATUS_HEXACHROME)
+        status = DENSITY_STATUS_E;
+    DENSITYSTRUCT d;
+    if (!ColorMath_ReflToDensities(pRefl, PaperRefls, status, &d))
+        return false;
+    return ColorMath_DensityToHueGray(d.Density[CYAN_RESPONSE], d.Density[MAGENTA_RESPONSE],
+                                      d.Density[YELLOW_RESPONSE], pGrayness, pHueError);
+}
+
+bool_t ColorMath_CMYToCast(const double* pCMY, double* pCast)
+{
+    if (!pCMY || !pCast)
+        return false;
+    *pCast = std::fmax(pCMY[0], std::fmax(pCMY[1], pCMY[2])) - std::fmin(pCMY[0], std::fmin(pCMY[1], pCMY[2]));
+    return true;
+}
+
+bool_t ColorMath_ReflToBrightness(const double* Refl, double* pBrightness)
+{
+    if (!Refl || !pBrightness)
+        return false;
+    static const double w[13] = {0.225, 1.49, 3.923, 7.451, 12.333, 17.591, 21.028,
+                                 18.665, 11.402, 4.569, 1.264, 0.062, -0.004};
+    double sum = 0.0;
+    for (int i = 0; i < 13; ++i)
+        sum += w[i] * Refl[i];
+    *pBrightness = sum / 100.0;
+    return true;
+}
+
+// ---- Dot area and contrast -----------------------------------------------------------------------
+
+bool_t ColorMath_DensityToDotArea(double dDenSolid, double dDenTint, double dCompensationFactor, double* pdDotArea)
+{
+    if (!pdDotArea)
+        return false;
+    if (dCompensationFactor == 0.0) {
+        *pdDotArea = 100.0;
+        return false;
+    }
+    const double n = dCompensationFactor;
+    const double d = 1.0 - pow10S(-(dDenSolid / n));
+    *pdDotArea = d == 0.0 ? 100.0 : (1.0 - pow10S(-(dDenTint / n))) / d * 100.0;
+    return true;
+}
+
+bool_t ColorMath_DensityFromDotArea(double dDenSolid, double dDotArea, double dCompensationFactor, double* pdDensity)
+{
+    if (!pdDensity || dCompensationFactor == 0.0)
+        return false;
+    const double n = dCompensationFactor;
+    const double A = dDotArea / 100.0;
+    const double x = pow10S(-dDenSolid / n) * A - A + 1.0;
+    if (x <= 0.0)
+        return false;
+    *pdDensity = -0.4342945 * n * double(logf(float(x)));
+    return true;
+}
+
+bool_t ColorMath_DensityToPrintContrast(double dDenSolid, double dDenTint, double* pPrintContrast)
+{
+    if (!pPrintContrast || dDenSolid == 0.0)
+        return false;
+    *pPrintContrast = (dDenSolid - dDenTint) / dDenSolid * 100.0;
+    return true;
+}
+
+bool_t ColorMath_FindNFactor(const double* pDenPaper, const double* pDenSolid, const double* pDenTint,
+                             double* pNFactor)
+{
+    if (!pDenPaper || !pDenSolid || !pDenTint || !pNFactor)
+        return false;
+    const double solid = *pDenSolid - *pDenPaper;
+    const double tint = *pDenTint - *pDenPaper;
+    double lo = 0.5, hi = 10.1;
+    for (int step = 0; step < 15; ++step) {
+        const double n = (lo + hi) / 2.0;
+        double area = 0.0;
+        ColorMath_DensityToDotArea(solid, tint, n, &area);
+        if (area >= 49.95 && area <= 50.04) {
+            *pNFactor = n;
+            return true;
+        }
+        if (area > 50.0)
+            lo = n;
+        else
+            hi = n;
+    }
+    return false;
+}
+
+bool_t ColorMath_CombineInkColors(const double* pInk1Refls, const double* pInk2Refls, double* pCombinedRefls)
+{
+    if (!pInk1Refls || !pInk2Refls || !pCombinedRefls)
+        return false;
+    double larger[NUM_WAVELENGTHS], smaller[NUM_WAVELENGTHS];
+    double largestSmaller = 0.0;
+    for (int i = 0; i < NUM_WAVELENGTHS; ++i) {
+        const double d1 = pInk1Refls[i] > 0.0 ? log10S(100.0 / pInk1Refls[i]) : 999.0;
+        const double d2 = pInk2Refls[i] > 0.0 ? log10S(100.0 / pInk2Refls[i]) : 999.0;
+        larger[i] = std::fmax(d1, d2);
+        smaller[i] = std::fmin(d1, d2);
+        largestSmaller = std::fmax(largestSmaller, smaller[i]);
+    }
+    const double f = largestSmaller > 0.0 ? 0.5 / largestSmaller : 0.0;
+    for (int i = 0; i < NUM_WAVELENGTHS; ++i) {
+        const double sum = larger[i] + (smaller[i] > 0.6 ? smaller[i] * f : 0.0);
+        pCombinedRefls[i] = 100.0 / pow10S(sum);
+    }
+    return true;
+}
+
+bool_t ColorMath_GetNormalizedDensityWeights(int nStatus, int nResponse, double* pWeights, int* pStartWaveLen,
+                                             int* pPeakWavelen, int* pEndWavelen)
+{
+    const int32_t* row = weightRow(nStatus, nResponse);
+    if (!row || !pWeights || !pStartWaveLen || !pPeakWavelen || !pEndWavelen)
+        return false;
+    int peak = 0, first = -1, last = -1;
+    for (int i = 0; i < NUM_WAVELENGTHS; ++i) {
+        if (row[i] > row[peak])
+            peak = i;
+        if (row[i] != 0) {
+            if (first < 0)
+                first = i;
+            last = i;
+        }
+    }
+    if (row[peak] == 0)
+        return false;
+    for (int i = 0; i < NUM_WAVELENGTHS; ++i)
+        pWeights[i] = double(row[i]) * 100.0 / double(row[peak]);
+    *pStartWaveLen = 400 + 10 * first;
+    *pPeakWavelen = 400 + 10 * peak;
+    *pEndWavelen = 400 + 10 * last;
+    return true;
+}
+
+bool_t ColorMath_DensitytoIntegratedRefl(double dDen, int status, int filter, double* pRefl)
+{
+    if (!pRefl || status == DENSITY_SPECTRAL_X || filter == 0)
+        return false;
+    const int32_t* row = weightRow(status, filter);
+    if (!row)
+        return false;
+    int32_t largest = 0;
+    for (int i = 0; i < NUM_WAVELENGTHS; ++i)
+        largest = row[i] > largest ? row[i] : largest;
+    if (largest == 0)
+        return false;
+    *pRefl = 1e7 / (double(largest) * pow10S(dDen));
+    return true;
+}
