@@ -322,5 +322,54 @@ bool_t ColorMath_CombineInkColors(const double* pInk1Refls, const double* pInk2R
 bool_t ColorMath_GetNormalizedDensityWeights(int nStatus, int nResponse, double* pWeights, int* pStartWaveLen,
                                              int* pPeakWavelen, int* pEndWavelen);
 bool_t ColorMath_DensitytoIntegratedRefl(double dDen, int status, int filter, double* pRefl);
+bool_t ColorMath_CalculateCCRDensities(const double* pRefl, const double* PaperRefls, int status,
+                                       DENSITYSTRUCT* pDensities);
+double ColorMathHelper_CalculateWeightedRefl(const double* dRefls, int index);
+double ColorMathHelper_CalculateSpecialDensity(const double* dRefls, int index, const double* pWeights, int n);
+double ColorMathHelper_CalculateSpecDensity(const double* dRefls, int index);
+void ColorMath_GetSpectralXConstants(double* pMinTolerance, double* pChromaticTolerance, double* pWeights);
+bool_t ColorMath_DensityMinusPaperToHueGrayDirection(const double* pCMY, const double* pPaperCMY,
+                                                     double* pGrayness, double* pHueError, int* eRetDir);
+// The response to read for a direction with a hue error above 50; false for
+// the directions that have none.
+bool_t ColorMath_GetDirectionDensity(const double* pCMY, int eRetDir, int* pResponse);
+bool_t ColorMath_ReflToCastBrightness(const double* pRefl, const double* pRefRefl, int status, double* pCast,
+                                      double* pBrightness);
+bool_t ColorMath_ReflToDotArea(const double* pReflPaper, const double* pReflSolid, const double* pReflTint,
+                               int status, int filter, double dCompensationFactor, double* pdDotArea);
+bool_t ColorMath_ReflToDotGain(const double* pReflPaper, const double* pReflSolid, const double* pReflTint,
+                               int status, int filter, double dCompensationFactor, int iScreenPerchentage,
+                               double* pdDotGain);
+bool_t ColorMath_ReflToPrintContrast(const double* pReflPaper, const double* pReflSolid, const double* pReflTint,
+                                     int status, int filter, double* pPrintContrast);
+// Polarisation: the spectrum scaled so that its status E responses meet the
+// filter readings of a polarised measurement.
+bool_t ColorMath_ReflToPolIntercept(const double* pNonPolRefls, double dRedFilterValue, double dGreenFilterValue,
+                                    double dBlueFilterValue, double* pIntercept);
+bool_t ColorMath_PolReflAdjust(const double* pRefl, const double* pPolFilters, double* pPolRefl, int* pInfo);
+bool_t ColorMath_PolReflToDensity(const double* pRefl, const double* pPolFilters, const double* PaperRefls,
+                                  int status, int filter, double* pDensity);
+bool_t ColorMath_PolReflToDensities(const double* pRefl, const double* pPolFilters, const double* PaperRefls,
+                                    int status, DENSITYSTRUCT* pDensities);
+bool_t ColorMath_PolReflToHueGray(const double* pRefl, const double* pPolFilters, const double* PaperRefls,
+                                  int status, double* pGrayness, double* pHueError);
+bool_t ColorMath_PolReflToDotArea(const double* pReflPaper, const double* pReflSolid, const double* pReflTint,
+                                  const double* pPolFilters, int status, int filter, double dCompensationFactor,
+                                  double* pdDotArea);
+bool_t ColorMath_PolReflToDotGain(const double* pReflPaper, const double* pReflSolid, const double* pReflTint,
+                                  const double* pPolFilters, int status, int filter, double dCompensationFactor,
+                                  int iScreenPerchentage, double* pdDotGain);
+bool_t ColorMath_PolReflToPrintContrast(const double* pReflPaper, const double* pReflSolid,
+                                        const double* pReflTint, const double* pPolFilters, int status, int filter,
+                                        double* pPrintContrast);
+bool_t ColorMath_PolReflToTrap(const double* pReflTop, const double* pReflBottom, const double* pReflOverprint,
+                               const double* ReflPaper, const double* pPolFilters, int status, int filter,
+                               double* pTrap);
+int ColorMath_PolDetermineDensityResponse(const double* pRefls, const double* pPolFilters, int status,
+                                          const double* pPaperRefls);
+// Centre wavelength indices and the weights around them, from den_weight;
+// false: the Hi-Fi and Hexachrome statuses have no weights here.
+bool_t ColorMath_GetHiFiConstants(int* pCentres, double* pWeights);
+bool_t ColorMath_GetHexachromeConstants(int* pCentres, double* pWeights);
 
 #endif // COLORMATH_H

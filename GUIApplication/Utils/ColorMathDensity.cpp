@@ -5,6 +5,8 @@
 
 #include "Utils/ColorMath.h"
 
+#include <QtGlobal>
+
 #include <cmath>
 #include <cstring>
 
@@ -276,6 +278,8 @@ bool_t ColorMath_ReflToDensities(const double* pRefl, const double* PaperRefls, 
     }
     if (status == DENSITY_SPECTRAL_X)
         return ColorMath_ReflToDensity(pRefl, PaperRefls, status, 0, &pDensities->Density[0]);
+    if (status == DENSITY_STATUS_Tx || status == DENSITY_STATUS_Ex || status == DENSITY_STATUS_G)
+        return ColorMath_CalculateCCRDensities(pRefl, PaperRefls, status, pDensities);
     if (!hasRows(status))
         return false;
     for (int response = VISUAL_RESPONSE; response <= YELLOW_RESPONSE; ++response) {
@@ -617,4 +621,289 @@ bool_t ColorMath_DensitytoIntegratedRefl(double dDen, int status, int filter, do
         return false;
     *pRefl = 1e7 / (double(largest) * pow10S(dDen));
     return true;
+}
+
+// ---- Corrections, wrappers and polarisation -------------------------------------------------
+
+bool_t ColorMath_CalculateCCRDensities(const double* pRefl, const double* PaperRefls, int status,
+                                       DENSITYSTRUCT* pDensities)
+{
+    Q_UNUSED(PaperRefls);
+    if (!pRefl || !pDensities)
+        return false;
+    std::memset(pDensities, 0, sizeof *pDensities);
+    // The corrected statuses (Tx, Ex, G) start from reflectances of their own
+    // filter rows, which our data do not have: refused, never guessed.
+    Q_UNUSED(status);
+    return false;
+}
+
+double ColorMathHelper_CalculateWeightedRefl(const double* dRefls, int index)
+{
+    return dRefls && index >= 0 && index < NUM_WAVELENGTHS ? weightedRefl(dRefls, index) : 0.0;
+}
+
+double ColorMathHelper_CalculateSpecialDensity(const double* dRefls, int index, const double* pWeights, int n)
+{
+    if (!dRefls || !pWeights || n <= 0 || index < 0 || index >= NUM_WAVELENGTHS)
+        return 0.0;
+    return specialDensity(dRefls, index, pWeights, n);
+}
+
+double ColorMathHelper_CalculateSpecDensity(const double* dRefls, int index)
+{
+    return ColorMathHelper_CalculateSpecialDensity(dRefls, index, kSpectralXWeights, 5);
+}
+
+void ColorMath_GetSpectralXConstants(double* pMinTolerance, double* pChromaticTolerance, double* pWeights)
+{
+    if (pMinTolerance)
+        *pMinTolerance = 2.0;
+    if (pChromaticTolerance)
+        *pChromaticTolerance = 84.0;
+    if (pWeights) {
+        pWeights[0] = 1.0;
+        pWeights[1] = 0.5;
+        pWeights[2] = 0.1;
+    }
+}
+
+bool_t ColorMath_DensityMinusPaperToHueGrayDirection(const double* pCMY, const double* pPaperCMY,
+                                                     double* pGrayness, double* pHueError, int* eRetDir)
+{
+    if (!pCMY || !pPaperCMY)
+        return false;
+    return ColorMath_DensityToHueGrayDirection(pCMY[0] - pPaperCMY[0], pCMY[1] - pPaperCMY[1],
+                                               pCMY[2] - pPaperCMY[2], pGrayness, pHueError, eRetDir);
+}
+
+bool_t ColorMath_GetDirectionDensity(const double* pCMY, int eRetDir, int* pResponse)
+{
+    if (!pCMY || !pResponse)
+        return false;
+    double grey = 0.0, hue = 0.0;
+    int dir = -1;
+    if (!ColorMath_DensityToHueGrayDirection(pCMY[0], pCMY[1], pCMY[2], &grey, &hue, &dir) || hue <= 50.0)
+        return false;
+    switch (eRetDir) {
+    case 0: *pResponse = 3; return true;
+    case 1: *pResponse = 2; return true;
+    case 4: *pResponse = 7; return true;
+    case 5: *pResponse = 6; return true;
+    case 8: *pResponse = 11; return true;
+    case 9: *pResponse = 10; return true;
+    default: return false;
+    }
+}
+
+bool_t ColorMath_ReflToCastBrightness(const double* pRefl, const double* pRefRefl, int status, double* pCast,
+                                      double* pBrightness)
+{
+    if (!pRefl || !pCast || !pBrightness)
+        return false;
+    double cmy[3], ref[3] = {0.0, 0.0, 0.0};
+    for (int f = 1; f <= 3; ++f) {
+        if (!ColorMath_ReflToReflDensity(pRefl, status, f, &cmy[f - 1]))
+            return false;
+        if (pRefRefl && !ColorMath_ReflToReflDensity(pRefRefl, status, f, &ref[f - 1]))
+            return false;
+    }
+    if (pRefRefl) {
+        for (int i = 0; i < 3; ++i)
+            cmy[i] -= ref[i];
+    }
+    double b = 0.0, refB = 0.0;
+    ColorMath_ReflToBrightness(pRefl, &b);
+    if (pRefRefl)
+        ColorMath_ReflToBrightness(pRefRefl, &refB);
+    *pBrightness = b - refB;
+    return ColorMath_CMYToCast(cmy, pCast);
+}
+
+bool_t ColorMath_ReflToDotArea(const double* pReflPaper, const double* pReflSolid, const double* pReflTint,
+                               int status, int filter, double dCompensationFactor, double* pdDotArea)
+{
+    double solid = 0.0, tint = 0.0;
+    if (!pReflSolid || !pReflTint || !pdDotArea
+        || !ColorMath_ReflToDensity(pReflSolid, pReflPaper, status, filter, &solid)
+        || !ColorMath_ReflToDensity(pReflTint, pReflPaper, status, filter, &tint))
+        return false;
+    return ColorMath_DensityToDotArea(solid, tint, dCompensationFactor, pdDotArea);
+}
+
+bool_t ColorMath_ReflToDotGain(const double* pReflPaper, const double* pReflSolid, const double* pReflTint,
+                               int status, int filter, double dCompensationFactor, int iScreenPerchentage,
+                               double* pdDotGain)
+{
+    double area = 0.0;
+    if (!pdDotGain
+        || !ColorMath_ReflToDotArea(pReflPaper, pReflSolid, pReflTint, status, filter, dCompensationFactor, &area))
+        return false;
+    const double gain = area - iScreenPerchentage;
+    *pdDotGain = gain < 0.0 ? 0.0 : gain;
+    return true;
+}
+
+bool_t ColorMath_ReflToPrintContrast(const double* pReflPaper, const double* pReflSolid, const double* pReflTint,
+                                     int status, int filter, double* pPrintContrast)
+{
+    double solid = 0.0, tint = 0.0;
+    if (!pReflSolid || !pReflTint || !pPrintContrast
+        || !ColorMath_ReflToDensity(pReflSolid, pReflPaper, status, filter, &solid)
+        || !ColorMath_ReflToDensity(pReflTint, pReflPaper, status, filter, &tint))
+        return false;
+    return ColorMath_DensityToPrintContrast(solid, tint, pPrintContrast);
+}
+
+bool_t ColorMath_ReflToPolIntercept(const double* pNonPolRefls, double dRedFilterValue, double dGreenFilterValue,
+                                    double dBlueFilterValue, double* pIntercept)
+{
+    if (!pNonPolRefls || !pIntercept)
+        return false;
+    const double values[3] = {dRedFilterValue, dGreenFilterValue, dBlueFilterValue};
+    double intercept[3];
+    for (int f = 1; f <= 3; ++f) {
+        const double sum = weightedSum(pNonPolRefls, weightRow(DENSITY_STATUS_E, f)) / 100.0;
+        intercept[f - 1] = (sum - 100000.0 * pow10S(-values[f - 1])) / 10.0;
+    }
+    const int response = ColorMath_DetermineDensityResponse(pNonPolRefls, DENSITY_STATUS_E, nullptr);
+    if (response >= CYAN_RESPONSE && response <= YELLOW_RESPONSE)
+        *pIntercept = intercept[response - 1];
+    else
+        *pIntercept = (intercept[0] + intercept[1] + intercept[2]) / 3.0;
+    return true;
+}
+
+bool_t ColorMath_PolReflAdjust(const double* pRefl, const double* pPolFilters, double* pPolRefl, int* pInfo)
+{
+    if (!pRefl || !pPolFilters || !pPolRefl)
+        return false;
+    const auto ratioOf = [pRefl, pPolFilters](int f) {
+        const double sum = weightedSum(pRefl, weightRow(DENSITY_STATUS_E, f)) * 0.00001;
+        double ratio = sum != 0.0 ? pPolFilters[f] / sum : 0.0;
+        if (ratio == 0.0 || ratio > 1.0)
+            ratio = 1.0;
+        return ratio;
+    };
+    int response = ColorMath_DetermineDensityResponse(pRefl, DENSITY_STATUS_E, nullptr);
+    double ratio;
+    if (response == CYAN_RESPONSE || response == MAGENTA_RESPONSE)
+        ratio = ratioOf(response);
+    else if (response == YELLOW_RESPONSE)
+        ratio = (ratioOf(MAGENTA_RESPONSE) + ratioOf(YELLOW_RESPONSE)) / 2.0;
+    else {
+        response = VISUAL_RESPONSE;
+        ratio = (ratioOf(0) + ratioOf(1) + ratioOf(2) + ratioOf(3)) / 4.0;
+    }
+    for (int i = 0; i < NUM_WAVELENGTHS; ++i)
+        pPolRefl[i] = pRefl[i] * ratio;
+    if (pInfo)
+        *pInfo = response;
+    return true;
+}
+
+namespace {
+
+// Adjusts a spectrum that may be null (paper is optional).
+const double* polAdjusted(const double* refl, const double* filters, double* buffer)
+{
+    if (!refl)
+        return nullptr;
+    return ColorMath_PolReflAdjust(refl, filters, buffer, nullptr) ? buffer : nullptr;
+}
+
+} // namespace
+
+bool_t ColorMath_PolReflToDensity(const double* pRefl, const double* pPolFilters, const double* PaperRefls,
+                                  int status, int filter, double* pDensity)
+{
+    double a[NUM_WAVELENGTHS], p[NUM_WAVELENGTHS];
+    const double* r = polAdjusted(pRefl, pPolFilters, a);
+    return r && ColorMath_ReflToDensity(r, polAdjusted(PaperRefls, pPolFilters, p), status, filter, pDensity);
+}
+
+bool_t ColorMath_PolReflToDensities(const double* pRefl, const double* pPolFilters, const double* PaperRefls,
+                                    int status, DENSITYSTRUCT* pDensities)
+{
+    double a[NUM_WAVELENGTHS], p[NUM_WAVELENGTHS];
+    const double* r = polAdjusted(pRefl, pPolFilters, a);
+    return r && ColorMath_ReflToDensities(r, polAdjusted(PaperRefls, pPolFilters, p), status, pDensities);
+}
+
+bool_t ColorMath_PolReflToHueGray(const double* pRefl, const double* pPolFilters, const double* PaperRefls,
+                                  int status, double* pGrayness, double* pHueError)
+{
+    double a[NUM_WAVELENGTHS], p[NUM_WAVELENGTHS];
+    const double* r = polAdjusted(pRefl, pPolFilters, a);
+    return r && ColorMath_ReflToHueGray(r, polAdjusted(PaperRefls, pPolFilters, p), status, pGrayness, pHueError);
+}
+
+bool_t ColorMath_PolReflToDotArea(const double* pReflPaper, const double* pReflSolid, const double* pReflTint,
+                                  const double* pPolFilters, int status, int filter, double dCompensationFactor,
+                                  double* pdDotArea)
+{
+    double p[NUM_WAVELENGTHS], s[NUM_WAVELENGTHS], t[NUM_WAVELENGTHS];
+    const double* solid = polAdjusted(pReflSolid, pPolFilters, s);
+    const double* tint = polAdjusted(pReflTint, pPolFilters, t);
+    return solid && tint
+           && ColorMath_ReflToDotArea(polAdjusted(pReflPaper, pPolFilters, p), solid, tint, status, filter,
+                                      dCompensationFactor, pdDotArea);
+}
+
+bool_t ColorMath_PolReflToDotGain(const double* pReflPaper, const double* pReflSolid, const double* pReflTint,
+                                  const double* pPolFilters, int status, int filter, double dCompensationFactor,
+                                  int iScreenPerchentage, double* pdDotGain)
+{
+    double p[NUM_WAVELENGTHS], s[NUM_WAVELENGTHS], t[NUM_WAVELENGTHS];
+    const double* solid = polAdjusted(pReflSolid, pPolFilters, s);
+    const double* tint = polAdjusted(pReflTint, pPolFilters, t);
+    return solid && tint
+           && ColorMath_ReflToDotGain(polAdjusted(pReflPaper, pPolFilters, p), solid, tint, status, filter,
+                                      dCompensationFactor, iScreenPerchentage, pdDotGain);
+}
+
+bool_t ColorMath_PolReflToPrintContrast(const double* pReflPaper, const double* pReflSolid,
+                                        const double* pReflTint, const double* pPolFilters, int status, int filter,
+                                        double* pPrintContrast)
+{
+    double p[NUM_WAVELENGTHS], s[NUM_WAVELENGTHS], t[NUM_WAVELENGTHS];
+    const double* solid = polAdjusted(pReflSolid, pPolFilters, s);
+    const double* tint = polAdjusted(pReflTint, pPolFilters, t);
+    return solid && tint
+           && ColorMath_ReflToPrintContrast(polAdjusted(pReflPaper, pPolFilters, p), solid, tint, status, filter,
+                                            pPrintContrast);
+}
+
+bool_t ColorMath_PolReflToTrap(const double* pReflTop, const double* pReflBottom, const double* pReflOverprint,
+                               const double* ReflPaper, const double* pPolFilters, int status, int filter,
+                               double* pTrap)
+{
+    double a[NUM_WAVELENGTHS], b[NUM_WAVELENGTHS], o[NUM_WAVELENGTHS], p[NUM_WAVELENGTHS];
+    const double* top = polAdjusted(pReflTop, pPolFilters, a);
+    const double* bottom = polAdjusted(pReflBottom, pPolFilters, b);
+    const double* over = polAdjusted(pReflOverprint, pPolFilters, o);
+    return top && bottom && over
+           && ColorMath_ReflToTrap(top, bottom, over, polAdjusted(ReflPaper, pPolFilters, p), status, filter, pTrap);
+}
+
+int ColorMath_PolDetermineDensityResponse(const double* pRefls, const double* pPolFilters, int status,
+                                          const double* pPaperRefls)
+{
+    double a[NUM_WAVELENGTHS], p[NUM_WAVELENGTHS];
+    const double* r = polAdjusted(pRefls, pPolFilters, a);
+    return r ? ColorMath_DetermineDensityResponse(r, status, polAdjusted(pPaperRefls, pPolFilters, p)) : -1;
+}
+
+bool_t ColorMath_GetHiFiConstants(int* pCentres, double* pWeights)
+{
+    Q_UNUSED(pCentres);
+    Q_UNUSED(pWeights);
+    return false;
+}
+
+bool_t ColorMath_GetHexachromeConstants(int* pCentres, double* pWeights)
+{
+    Q_UNUSED(pCentres);
+    Q_UNUSED(pWeights);
+    return false;
 }

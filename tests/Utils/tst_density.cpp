@@ -157,6 +157,49 @@ private slots:
         QVERIFY(!ColorMath_DensityToPrintContrast(0.0, 0.6, &contrast));
     }
 
+    void wrappersAndPolarisation()
+    {
+        double ink[NUM_WAVELENGTHS], paper[NUM_WAVELENGTHS], tint[NUM_WAVELENGTHS];
+        cyanInk(ink);
+        flat(paper, 90.0);
+        for (int i = 0; i < NUM_WAVELENGTHS; ++i)
+            tint[i] = (ink[i] + paper[i]) / 2.0;
+        double gain = -1.0, area = 0.0;
+        QVERIFY(ColorMath_ReflToDotArea(paper, ink, tint, DENSITY_STATUS_t, CYAN_RESPONSE, 1.0, &area));
+        QVERIFY(ColorMath_ReflToDotGain(paper, ink, tint, DENSITY_STATUS_t, CYAN_RESPONSE, 1.0, 50, &gain));
+        QVERIFY(std::fabs(gain - std::max(0.0, area - 50.0)) < 1e-9);
+        QVERIFY(ColorMath_ReflToDotGain(paper, ink, tint, DENSITY_STATUS_t, CYAN_RESPONSE, 1.0, 100, &gain));
+        QCOMPARE(gain, 0.0);
+
+        // A polarised reading equal to the unpolarised one changes nothing;
+        // a darker one scales the spectrum down.
+        double filters[4];
+        for (int f = 0; f < 4; ++f)
+            QVERIFY(ColorMath_ReflToReflDensity(ink, DENSITY_STATUS_E, f, &filters[f]));
+        double adjusted[NUM_WAVELENGTHS];
+        int response = -1;
+        QVERIFY(ColorMath_PolReflAdjust(ink, filters, adjusted, &response));
+        QCOMPARE(response, int(CYAN_RESPONSE));
+        QVERIFY(std::fabs(adjusted[20] - ink[20]) < 1e-9);
+        filters[CYAN_RESPONSE] /= 2.0;
+        QVERIFY(ColorMath_PolReflAdjust(ink, filters, adjusted, &response));
+        QVERIFY(std::fabs(adjusted[20] - ink[20] / 2.0) < 1e-6);
+        double plain = 0.0, polarised = 0.0;
+        QVERIFY(ColorMath_ReflToDensity(ink, nullptr, DENSITY_STATUS_E, CYAN_RESPONSE, &plain));
+        QVERIFY(ColorMath_PolReflToDensity(ink, filters, nullptr, DENSITY_STATUS_E, CYAN_RESPONSE, &polarised));
+        QVERIFY(std::fabs(polarised - plain - std::log10(2.0)) < 1e-3);
+
+        int dir = 0;
+        const double cmy[3] = {0.2, 1.4, 0.9};
+        QVERIFY(ColorMath_GetDirectionDensity(cmy, 4, &dir));
+        QCOMPARE(dir, 7);
+        QVERIFY(!ColorMath_GetDirectionDensity(cmy, 2, &dir));
+
+        DENSITYSTRUCT d;
+        QVERIFY(!ColorMath_ReflToDensities(ink, nullptr, DENSITY_STATUS_Ex, &d));
+        QVERIFY(!ColorMath_GetHiFiConstants(nullptr, nullptr));
+    }
+
     void namesAndWeights()
     {
         QCOMPARE(ColorMath_StatusNameToIndex("Status T"), 3);
