@@ -74,6 +74,9 @@ ScreenMaster::ScreenMaster(QWidget* parent)
     qRegisterMetaType<SCREEN_ID_T>("SCREEN_ID");
     qRegisterMetaType<SCREEN_ID_T>("SCREEN_ID_T");
 
+    // The language's font before the first widget exists: widgets polished
+    // by a style sheet take the font they are polished with.
+    QApplication::setFont(LocaleHelper::determineFontFromCountryCode(UserParams::getLanguageCode()));
     LaunchFirstScreen();
 
     connect(DataManager::instance(), &DataManager::languageChanged, this, &ScreenMaster::onLoadLanguage);
@@ -302,6 +305,12 @@ bool ScreenMaster::onLoadLanguage(const QString& code)
 {
     QMutexLocker locker(&lock_);
     QApplication::setFont(LocaleHelper::determineFontFromCountryCode(code));
+    // A widget with a style sheet keeps the font it was polished with; only
+    // setting its sheet again makes it take the new family.
+    for (QWidget* widget : QApplication::allWidgets()) {
+        if (!widget->styleSheet().isEmpty())
+            widget->setStyleSheet(widget->styleSheet());
+    }
     const bool loaded = onLoadLanguageFile(languageFilePath(code));
     // Whatever the load gave: a missing file leaves the previous texts.
     reTranslateStringTables();

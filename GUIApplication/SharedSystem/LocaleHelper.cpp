@@ -36,5 +36,17 @@ QString LocaleHelper::fontFamilyForCountryCode(const QString& code)
 
 QFont LocaleHelper::determineFontFromCountryCode(const QString& code)
 {
-    return QFont(fontFamilyForCountryCode(code));
+    const QString family = fontFamilyForCountryCode(code);
+    // The device installs the CJK fonts under their full names ("... JP
+    // Regular"); a desktop's font configuration names the family without
+    // the style. Without this the family is not found and the text falls
+    // back to whatever the desktop's default is.
+    static const QString suffix = QStringLiteral(" Regular");
+    if (family.endsWith(suffix) && QFont::substitute(family) == family) {
+        const QStringList installed = QFontDatabase().families();
+        const QString bare = family.left(family.size() - suffix.size());
+        if (!installed.contains(family) && installed.contains(bare))
+            QFont::insertSubstitution(family, bare);
+    }
+    return QFont(family);
 }

@@ -9,7 +9,11 @@ namespace Theme {
 
 QFont font(int pointSize, bool bold)
 {
-    QFont f = QApplication::font();
+    // Only size and weight are set: the family stays unresolved, so every
+    // widget follows the language's font, also when the language changes
+    // after the widget was built. A copy of QApplication::font() would pin
+    // whatever family the application had at that moment.
+    QFont f;
     f.setPointSize(pointSize);
     f.setBold(bold);
     return f;

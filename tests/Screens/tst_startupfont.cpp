@@ -1,0 +1,74 @@
+// The font the running program draws in: the real ScreenMaster start-up,
+// with the home screen from the real factory, reads its family from the
+// language, not from the desktop's default.
+
+#include "GUIAPI/DataManager.h"
+#include "Screens/ScreenMaster.h"
+#include "SharedSystem/LocaleHelper.h"
+#include "SharedSystem/StringTables.h"
+
+#include <QApplication>
+#include <QFontInfo>
+#include <QLabel>
+#include <QPushButton>
+#include <QtTest>
+
+class TestStartupFont : public QObject
+{
+    Q_OBJECT
+
+private:
+    // The families actually used by the visible texts of the current screen.
+    static QSet<QString> familiesOnScreen(ScreenMaster& master)
+    {
+        QSet<QString> families;
+        QWidget* screen = master.currentScreen();
+        if (!screen)
+            return families;
+        for (QLabel* label : screen->findChildren<QLabel*>()) {
+            if (label->isVisibleTo(screen) && !label->text().isEmpty())
+                families.insert(QFontInfo(label->font()).family());
+        }
+        for (QPushButton* button : screen->findChildren<QPushButton*>()) {
+            if (button->isVisibleTo(screen) && !button->text().isEmpty())
+                families.insert(QFontInfo(button->font()).family());
+        }
+        return families;
+    }
+
+private slots:
+    void initTestCase()
+    {
+        // What a desktop gives a program before it chooses its own font.
+        QApplication::setFont(QFont("DejaVu Sans", 10));
+        StringTables::Init();
+        DataManager::instance();
+    }
+
+    void homeScreenDrawsInTheLanguagesFont()
+    {
+        ScreenMaster master;
+        master.show();
+        QVERIFY(QTest::qWaitForWindowExposed(&master));
+        const QString expected = QFontInfo(LocaleHelper::determineFontFromCountryCode("en")).family();
+        QVERIFY(expected != "DejaVu Sans");
+        const QSet<QString> families = familiesOnScreen(master);
+        QVERIFY(!families.isEmpty());
+        QVERIFY2(families == QSet<QString>{expected}, qPrintable(QStringList(families.values()).join(", ")));
+    }
+
+    void aLanguageChangeReachesScreensAlreadyBuilt()
+    {
+        ScreenMaster master;
+        master.show();
+        QVERIFY(QTest::qWaitForWindowExposed(&master));
+        master.onLoadLanguage("ja");
+        const QString japanese = QFontInfo(LocaleHelper::determineFontFromCountryCode("ja")).family();
+        QVERIFY2(japanese.contains("CJK"), qPrintable(japanese)); // the installed CJK font, not a fallback
+        QCOMPARE(familiesOnScreen(master), QSet<QString>{japanese});
+        master.onLoadLanguage("en");
+    }
+};
+
+QTEST_MAIN(TestStartupFont)
+#include "tst_startupfont.moc"
