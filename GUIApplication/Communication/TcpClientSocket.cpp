@@ -13,6 +13,13 @@ TCPClientSocket::TCPClientSocket(QObject* parent)
     }
 }
 
+TCPClientSocket::~TCPClientSocket()
+{
+    // QAbstractSocket's destructor closes the connection and signals it;
+    // by then this part of the object is gone, so its slots must not run.
+    disconnect(this, nullptr, this, nullptr);
+}
+
 void TCPClientSocket::onDisconnected()
 {
     deleteLater();

@@ -27,6 +27,7 @@ class TCPClientSocket : public QTcpSocket, public EntityIDProvider
 
 public:
     explicit TCPClientSocket(QObject* parent = nullptr);
+    ~TCPClientSocket() override;
 
 public slots:
     void onDisconnected();
