@@ -300,11 +300,29 @@ void DaddyPanel::SetActiveStatus(bool active)
 {
     m_ActiveStatus = active;
     emit setActiveStatusSignal(active);
-    if (active)
+    if (active) {
+        raiseOwnedWidgets();
         grabKeyboard();
-    else
+    } else {
         releaseKeyboard();
+    }
     update();
+}
+
+void DaddyPanel::raiseOwnedWidgets()
+{
+    // The popups and covers are siblings of the panel in the screen stack.
+    // A panel that comes back on top (a fault screen closed over it) is
+    // raised by the stack; what it owns must stand above it again, whole.
+    for (PopupPanel* popup : m_popups) {
+        if (popup)
+            popup->raise();
+    }
+    for (QWidget* owned : {static_cast<QWidget*>(m_messageBox), static_cast<QWidget*>(m_powerDownPopup),
+                           m_calPopup, m_lockScreen}) {
+        if (owned)
+            owned->raise();
+    }
 }
 
 void DaddyPanel::onUpdateScreen()

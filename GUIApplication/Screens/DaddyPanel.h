@@ -163,6 +163,7 @@ private:
     TRANSITION_DIRECTION_T m_transitionOutDirection = TRANSITION_DIRECTION_IN_RIGHT;
     std::vector<PopupPanel*> m_popups;
     QLabel m_shadow;
+    void raiseOwnedWidgets();
     QWidget* m_calPopup = nullptr;
     PopupPanel* m_messageBox = nullptr;
     PowerDownPopup* m_powerDownPopup = nullptr;

@@ -33,6 +33,7 @@
 #include <QPushButton>
 #include <QScrollBar>
 #include <QSignalSpy>
+#include <QPointer>
 #include <QtTest>
 
 namespace {
@@ -109,6 +110,7 @@ private slots:
     void rowShowsSyncProgress();
     void sendAllMarksRowsSynchronised();
     void lostLinkShowsFaultAndComesBack();
+    void popupStandsWholeAfterRecovery();
 
 private:
     JobListScreen* home() const;
@@ -674,6 +676,36 @@ void tst_JobList::lostLinkShowsFaultAndComesBack()
     QTRY_VERIFY_WITH_TIMEOUT(m_master->currentScreen() == home(), 20000);
     QTRY_VERIFY_WITH_TIMEOUT(DataManager::instance()->getDataInitialized(), 20000);
     refreshAndWait(1, 2);
+}
+
+void tst_JobList::popupStandsWholeAfterRecovery()
+{
+    // A warning up when the link dies: after the fault screen has gone it
+    // must stand above the list again, not be half covered by it.
+    QVERIFY(control(QStringLiteral("battery 8")).startsWith(QLatin1String("OK")));
+    QTRY_VERIFY_WITH_TIMEOUT(popupCount() > 0, 10000);
+    QPointer<PopupPanel> warning = home()->popups().back();
+    QVERIFY(control(QStringLiteral("battery 72")).startsWith(QLatin1String("OK")));
+    QVERIFY(control(QStringLiteral("drop 3")).startsWith(QLatin1String("OK")));
+    QTRY_VERIFY_WITH_TIMEOUT(m_master->currentScreen()
+                                 && QString(m_master->currentScreen()->metaObject()->className()) == QLatin1String("SadPuppyScreen"),
+                             5000);
+    QTRY_VERIFY_WITH_TIMEOUT(m_master->currentScreen() == home(), 20000);
+    QTRY_VERIFY_WITH_TIMEOUT(DataManager::instance()->getDataInitialized(), 20000);
+    QTest::qWait(300);
+
+    if (warning && warning->isVisible()) {
+        // Whole: whatever is drawn at its corners and its middle is the popup.
+        QWidget* display = warning->parentWidget();
+        const QRect area = warning->geometry();
+        for (const QPoint& p : {area.center(), area.topLeft() + QPoint(20, 20), area.bottomRight() - QPoint(20, 20)}) {
+            QWidget* hit = display->childAt(p);
+            QVERIFY2(hit && (hit == warning || warning->isAncestorOf(hit)),
+                     qPrintable(QString("at %1,%2: %3").arg(p.x()).arg(p.y())
+                                    .arg(hit ? hit->metaObject()->className() : "nothing")));
+        }
+    }
+    goHome();
 }
 
 QTEST_MAIN(tst_JobList)

@@ -126,7 +126,7 @@ private slots:
         QCOMPARE(activeNames(master), QStringList({"JobMeasureScreen"}));
         QVERIFY(!master.onAddScreenToStack(POPUPS_SCREEN_ID));
         QVERIFY(!master.onAddScreenToStack(CAL_NEEDED_POPUP_SCREEN_ID));
-        QVERIFY(!master.onAddScreenToStack(SCREEN_ID_T(999)));
+        QVERIFY(!master.onAddScreenToStack(NUM_SCREEN_IDS)); // a valid value that names no screen
         QCOMPARE(names(master), QStringList({"JobListScreen", "JobMeasureScreen"}));
         QCOMPARE(activeNames(master), QStringList({"JobMeasureScreen"}));
 
