@@ -436,11 +436,17 @@ void DaddyPanel::watchCover(DaddyPanel* cover)
 
 void DaddyPanel::onCoverClosed(QWidget* cover)
 {
+    // The queued request may name a cover that was deleted meanwhile: only
+    // once the pointer is known to be one of ours is the object touched.
     // Only the cover that asked, not a newer one in the same place.
+    if (!cover || (cover != m_lockScreen && cover != m_calPopup))
+        return;
     auto* closing = qobject_cast<DaddyPanel*>(cover);
-    if (cover == m_lockScreen && closing && closing->isClosing())
+    if (!closing || !closing->isClosing())
+        return;
+    if (cover == m_lockScreen)
         onCloseLockScreen();
-    else if (cover == m_calPopup && closing && closing->isClosing())
+    else
         onCloseCalScreen();
 }
 

@@ -167,8 +167,15 @@ QWidget* ScreenMaster::onAddScreenToStack(SCREEN_ID_T id)
 {
     QMutexLocker locker(&lock_);
     QWidget* screen = createScreen(id);
-    if (!screen)
+    if (!screen) {
+        // The asking panel often disabled itself to wait for the new screen;
+        // it must not stay dead when none comes.
+        qDebug() << "ScreenMaster: no screen for id" << int(id);
+        activateTop();
+        if (QWidget* top = m_ScreenStack->currentWidget())
+            top->setEnabled(true);
         return nullptr;
+    }
     m_ScreenStack->addWidget(screen);
     m_ScreenStack->setCurrentWidget(screen);
     for (int i = 0; i < m_ScreenStack->count(); ++i) {

@@ -17,6 +17,7 @@
 #include "Widgets/XPushButton.h"
 
 #include <QSignalSpy>
+#include <QPointer>
 #include <QtTest>
 
 namespace {
@@ -205,6 +206,27 @@ private slots:
         QTest::qWait(SyncScreen::DefaultTimeLimitMs - 300);
         QCOMPARE(syncClosed.count(), 0);
         QTRY_COMPARE_WITH_TIMEOUT(syncClosed.count(), 1, 1500);
+    }
+
+    void aCoverDeletedBeforeItsQueuedCloseIsNotTouched()
+    {
+        // The sync cover's time limit queues its close; the owner may delete
+        // it first (the rebuild it covered has ended). The queued request then
+        // carries a dangling pointer, which must only be compared, never used.
+        QWidget display;
+        auto* panel = new DaddyPanel(&display);
+        panel->onShowSyncScreen();
+        auto* cover = display.findChild<SyncScreen*>();
+        QVERIFY(cover);
+        cover->CloseScreen();
+        panel->onCloseSyncScreen();
+        QVERIFY(!display.findChild<SyncScreen*>());
+        QCoreApplication::processEvents();
+        // A newer cover in the same place is not closed by the old request.
+        panel->onShowSyncScreen();
+        QPointer<SyncScreen> newer = display.findChild<SyncScreen*>();
+        QCoreApplication::processEvents();
+        QVERIFY(newer);
     }
 
     void theFaultScreenAnnouncesItself()

@@ -1,6 +1,7 @@
-// The font the running program draws in: the real ScreenMaster start-up,
-// with the home screen from the real factory, reads its family from the
-// language, not from the desktop's default.
+// The real ScreenMaster start-up, with the home screen from the real
+// factory: the font it draws in comes from the language, not from the
+// desktop's default, and the home screen stays usable when a screen it asks
+// for does not come.
 
 #include "GUIAPI/DataManager.h"
 #include "Screens/ScreenMaster.h"
@@ -67,6 +68,25 @@ private slots:
         QVERIFY2(japanese.contains("CJK"), qPrintable(japanese)); // the installed CJK font, not a fallback
         QCOMPARE(familiesOnScreen(master), QSet<QString>{japanese});
         master.onLoadLanguage("en");
+    }
+
+    void homeStaysUsableWhenARequestedScreenDoesNotCome()
+    {
+        ScreenMaster master;
+        master.show();
+        QVERIFY(QTest::qWaitForWindowExposed(&master));
+        QWidget* home = master.currentScreen();
+        QVERIFY(home);
+        // Settings disable the list while their screen is built.
+        QVERIFY(QMetaObject::invokeMethod(home, "on_BtnSettings_clicked"));
+        QTRY_VERIFY(master.currentScreen() != home || home->isEnabled());
+        if (master.currentScreen() == home)
+            QVERIFY(home->isEnabled());
+        // A request for an id that names no screen at all.
+        home->setEnabled(false);
+        QVERIFY(!master.onAddScreenToStack(POPUPS_SCREEN_ID));
+        QCOMPARE(master.currentScreen(), home);
+        QVERIFY(home->isEnabled());
     }
 };
 
