@@ -4,6 +4,7 @@
 #include "Widgets/KLabel.h"
 #include "Widgets/XPushButton.h"
 
+#include <QEvent>
 #include <QLabel>
 
 void Ui::DeletePopup::setupUi(QWidget* popup)
@@ -41,8 +42,23 @@ DeletePopup::~DeletePopup()
     delete ui;
 }
 
+void DeletePopup::changeEvent(QEvent* event)
+{
+    PopupPanel::changeEvent(event);
+    if (event->type() != QEvent::LanguageChange)
+        return;
+    if (!m_ownHeader)
+        ui->labelHeader->setText(tr("Delete All Samples?"));
+    if (!m_ownConfirm)
+        ui->BtnConfirm->setText(tr("Delete"));
+    if (!m_ownCancel)
+        ui->BtnCancel->setText(tr("No"));
+    PopupForm::arrange(ui->labelIcon, ui->labelHeader, ui->labelMessage);
+}
+
 void DeletePopup::setHeaderText(const QString& text)
 {
+    m_ownHeader = true;
     ui->labelHeader->setText(text);
     PopupForm::arrange(ui->labelIcon, ui->labelHeader, ui->labelMessage);
 }
@@ -55,11 +71,13 @@ void DeletePopup::setMessageText(const QString& text)
 
 void DeletePopup::setConfirmButtonText(const QString& text)
 {
+    m_ownConfirm = true;
     ui->BtnConfirm->setText(text);
 }
 
 void DeletePopup::setCancelButtonText(const QString& text)
 {
+    m_ownCancel = true;
     ui->BtnCancel->setText(text);
 }
 

@@ -45,7 +45,16 @@ public slots:
     void onCancelClicked();
 
 protected:
+    void changeEvent(QEvent* event) override;
+
     Ui::DeletePopup* ui;
+
+private:
+    // The owner's own texts are already translated; the defaults follow a
+    // language change.
+    bool m_ownHeader = false;
+    bool m_ownConfirm = false;
+    bool m_ownCancel = false;
 };
 
 #endif // DELETEPOPUP_H

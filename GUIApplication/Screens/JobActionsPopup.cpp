@@ -28,7 +28,7 @@ QPixmap cardOfSize(const QSize& size)
     painter.setRenderHint(QPainter::SmoothPixmapTransform);
     const QMargins corners(14, 14, 14, 14);
     qDrawBorderPixmap(&painter, card.rect(), corners,
-                      QPixmap(QStringLiteral(":/Assets/modal_overlay_inset_440.png")));
+                      QPixmap(QStringLiteral(":/Assets/modal_overlay_inset_200.png")));
     return card;
 }
 

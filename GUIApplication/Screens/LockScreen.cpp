@@ -1,22 +1,23 @@
 #include "Screens/LockScreen.h"
 
 #include "Screens/PopupForm.h"
-#include "Widgets/BusySpinner.h"
+#include "Widgets/SpinnyCircle.h"
 #include "Widgets/KLabel.h"
 
+#include <QCoreApplication>
+#include <QEvent>
 #include <QLabel>
 
 void Ui::LockScreen::setupUi(QWidget* screen)
 {
     labelBackGround = PopupForm::dimmer(screen, "labelBackGround");
     icnPopupBkgnd = PopupForm::card(screen, false, "icnPopupBkgnd");
-    spinner = new BusySpinner(screen);
+    spinner = new SpinnyCircle(screen);
     spinner->setObjectName("spinner");
-    spinner->setGeometry(132, Theme::ShortCard.top() + 34, 56, 56);
+    spinner->move(130, Theme::ShortCard.top() + 32);
     labelTextTitle = PopupForm::title(screen, "labelTextTitle",
                                       QRect(26, Theme::ShortCard.top() + 108, 268, 64));
     labelTextTitle->setWordWrap(true);
-    labelTextTitle->setText(::LockScreen::tr("Instrument Locked"));
 }
 
 LockScreen::LockScreen(QWidget* parent)
@@ -43,13 +44,29 @@ void LockScreen::init()
 {
     setObjectName("LockScreen");
     ui->setupUi(this);
+    setDefaultTitle("LockScreen", QT_TRANSLATE_NOOP("LockScreen", "Instrument Locked"));
     killTimer.setSingleShot(true);
     connect(&killTimer, &QTimer::timeout, this, &LockScreen::onKillTimeout);
 }
 
 void LockScreen::setTitle(const QString& text)
 {
+    m_titleContext = m_titleSource = nullptr;
     ui->labelTextTitle->setText(text);
+}
+
+void LockScreen::setDefaultTitle(const char* context, const char* sourceText)
+{
+    m_titleContext = context;
+    m_titleSource = sourceText;
+    ui->labelTextTitle->setText(QCoreApplication::translate(context, sourceText));
+}
+
+void LockScreen::changeEvent(QEvent* event)
+{
+    DaddyPanel::changeEvent(event);
+    if (event->type() == QEvent::LanguageChange && m_titleSource)
+        ui->labelTextTitle->setText(QCoreApplication::translate(m_titleContext, m_titleSource));
 }
 
 QString LockScreen::title() const

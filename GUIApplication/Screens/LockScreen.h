@@ -5,7 +5,7 @@
 
 #include <QTimer>
 
-class BusySpinner;
+class SpinnyCircle;
 class KLabel;
 class QLabel;
 
@@ -14,7 +14,7 @@ struct LockScreen
 {
     QLabel* labelBackGround = nullptr;
     QLabel* icnPopupBkgnd = nullptr;
-    BusySpinner* spinner = nullptr;
+    SpinnyCircle* spinner = nullptr;
     KLabel* labelTextTitle = nullptr;
     void setupUi(QWidget* screen);
 };
@@ -38,11 +38,19 @@ public slots:
     void onKillTimeout();
 
 protected:
+    void changeEvent(QEvent* event) override;
+    // A title given by its source text, translated now and again on every
+    // language change (setTitle takes text already translated).
+    void setDefaultTitle(const char* context, const char* sourceText);
+
     Ui::LockScreen* ui;
     QTimer killTimer;
 
 private:
     void init();
+
+    const char* m_titleContext = nullptr;
+    const char* m_titleSource = nullptr;
 };
 
 #endif // LOCKSCREEN_H

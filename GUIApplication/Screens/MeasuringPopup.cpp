@@ -154,9 +154,9 @@ void MeasuringPopup::setState(MEASURING_POPUP_STATE_T state)
     ProgressBarCircle* circle = ui->progressBarCircle;
     m_propertyAnimation.stop();
     circle->setValue(0);
+    // Measuring leaves the sub text as it stands: the form's "Hold Steady".
     if (state == STATE_POPUP_MEASURING) {
         ui->labelText->setText(tr("Measuring"));
-        ui->labelSubText->setText(tr("Hold Steady"));
     } else if (calculating) {
         ui->labelText->setText(tr("Calculating"));
         ui->labelSubText->setText(tr("OK to move instrument"));

@@ -9,5 +9,5 @@ SyncScreen::SyncScreen(int ms, QWidget* parent)
     : LockScreen(ms, parent)
 {
     setObjectName("SyncScreen");
-    setTitle(tr("Syncing Job Data"));
+    setDefaultTitle("SyncScreen", QT_TRANSLATE_NOOP("SyncScreen", "Syncing Job Data"));
 }

@@ -18,6 +18,9 @@
 
 #include <QSignalSpy>
 #include <QPointer>
+#include <QTranslator>
+#include "Screens/ScreenMaster.h"
+#include "Widgets/SpinnyCircle.h"
 #include <QtTest>
 
 namespace {
@@ -206,6 +209,32 @@ private slots:
         QTest::qWait(SyncScreen::DefaultTimeLimitMs - 300);
         QCOMPARE(syncClosed.count(), 0);
         QTRY_COMPARE_WITH_TIMEOUT(syncClosed.count(), 1, 1500);
+    }
+
+    void defaultTextsFollowTheLanguage()
+    {
+        LockScreen lock;
+        SyncScreen sync;
+        LockScreen calibrating;
+        calibrating.setTitle(QStringLiteral("Calibrating"));
+        DeletePopup ask;
+        DeletePopup custom;
+        custom.setHeaderText(QStringLiteral("Delete Job?"));
+        QVERIFY(lock.findChild<SpinnyCircle*>()); // one spinner for every cover
+
+        QTranslator german;
+        QVERIFY(german.load(ScreenMaster::languageFilePath("de")));
+        QCoreApplication::installTranslator(&german);
+        QCoreApplication::processEvents(); // the change reaches windows as a posted event
+        QCOMPARE(lock.title(), QString("Gerät gesperrt"));
+        QCOMPARE(sync.title(), QString("Auftragsdaten werden synchronisiert"));
+        QCOMPARE(calibrating.title(), QString("Calibrating")); // the owner's text stays
+        QCOMPARE(labelText(&ask, "labelHeader"), QString("Alle Proben löschen?"));
+        QCOMPARE(buttonText(&ask, "BtnCancel"), QString("Nein"));
+        QCOMPARE(labelText(&custom, "labelHeader"), QString("Delete Job?"));
+        QCoreApplication::removeTranslator(&german);
+        QCoreApplication::processEvents();
+        QCOMPARE(lock.title(), QString("Instrument Locked"));
     }
 
     void aCoverDeletedBeforeItsQueuedCloseIsNotTouched()
