@@ -122,6 +122,9 @@ public:
     // Null for a key the server does not keep.
     const ParamValue* parameter(int key) const;
     STATUS_T setParameter(int key, const ParamValue& value);
+    // Stores a value without the checks of the link, as a damaged or reset
+    // store would hold it, and announces it.
+    void forceParameter(int key, const ParamValue& value) { setParameterValue(key, value, true); }
     void parametersToDefaults();
     JobBook::Defaults jobDefaults() const;
 

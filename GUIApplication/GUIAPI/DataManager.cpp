@@ -351,10 +351,10 @@ void DataManager::applySettingsBits(const SystemStatus& status, bool jobsChanged
     PARAMETER_CONTENT_TYPES value;
 
     if ((bits & kBitLanguage) && readParameter(PARAMETER_CURRENT_LANGUAGE_ID, value)) {
+        // An empty code is a change like any other: the English keypad, the
+        // parameter written back, and the screens told.
         const QString code = value.parameterString.trimmed();
-        if (code.isEmpty())
-            qDebug() << "DataManager: server reports no language, keeping" << params->getLanguageCode();
-        else if (code.toUpper() != params->getLanguageCode().trimmed().toUpper())
+        if (code.toUpper() != params->getLanguageCode().trimmed().toUpper())
             setLanguageCode(value.parameterString);
     }
     if (bits & kBitBrightness) {

@@ -945,9 +945,12 @@ void DataManager::onLoadWifiSettings()
 {
     {
         QMutexLocker locker(&m_lock);
+        // What a failed read gives is no list: networks from an earlier
+        // read may be gone, and the page must not offer them.
         QVector<NETWORK_DESCRIPTION_T> networks;
-        if (SysAPI_GetWifiSettings(networks))
-            m_NetworkDescriptions = networks;
+        if (!SysAPI_GetWifiSettings(networks))
+            networks.clear();
+        m_NetworkDescriptions = networks;
         QString address;
         if (SysAPI_GetIpAddress(address))
             m_ipAddress = address;

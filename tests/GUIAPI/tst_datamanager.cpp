@@ -25,6 +25,8 @@ private slots:
 
     void languageBitChangesTheLanguage();
     void volumeAndBrightnessBitsTakeTheServersValues();
+    void wifiReadFailureLeavesNoStaleNetworks();
+    void measuringCircleBitTakesTheServersPicture();
     void textMessageIsShownEveryTime();
     void averagingDefaultsFollowTheServer();
     void orientationBitSwitchesOrientation();
@@ -172,8 +174,47 @@ void TestDataManager::languageBitChangesTheLanguage()
     QVERIFY(m_log.waitFor("StatusUpdated", 3000, 3));
     QCOMPARE(m_log.countStartingWith("languageChanged"), 1);
 
+    // No language at all from the server: English keys, the empty code
+    // written back, and the screens told.
+    // (The simulator refuses an empty code from its control port, as it
+    // refuses it from the link: set it underneath, as a server reset would.)
+    m_sim->call([](Sim::Server& s) {
+        Sim::ParamValue empty = *s.instrument().parameter(PARAMETER_CURRENT_LANGUAGE_ID);
+        empty.s.clear();
+        s.instrument().forceParameter(PARAMETER_CURRENT_LANGUAGE_ID, empty);
+    });
+    QVERIFY(m_log.waitFor("languageChanged()", 3000));
+    QVERIFY(!m_dm->getKeypadArray().isEmpty());
+
     QCOMPARE(control("param 18 " + before), QString("OK"));
     QVERIFY(m_log.waitFor("languageChanged(" + before + ")", 3000));
+}
+
+void TestDataManager::wifiReadFailureLeavesNoStaleNetworks()
+{
+    QCOMPARE(control("wifi on"), QString("OK"));
+    QCOMPARE(control("wifi network Bodyshop-Guest in 0.7 OPEN"), QString("OK"));
+    onDataManagerThread([this] { m_dm->onLoadWifiSettings(); });
+    const auto all = [this] { return m_dm->getKnownNetworkDescriptions() + m_dm->getUnknownNetworkDescriptions(); };
+    QVERIFY(!all().isEmpty());
+
+    // The radio's list can't be read: nothing from before may stay offered.
+    QVERIFY(control(QString("refuse %1 2").arg(0x400A0C00)).startsWith("OK"));
+    onDataManagerThread([this] { m_dm->onLoadWifiSettings(); });
+    QVERIFY(all().isEmpty());
+    QVERIFY(control("refuse off").startsWith("OK"));
+    onDataManagerThread([this] { m_dm->onLoadWifiSettings(); });
+    QVERIFY(!all().isEmpty());
+    QCOMPARE(control("wifi network Bodyshop-Guest out"), QString("OK"));
+    QCOMPARE(control("wifi off"), QString("OK"));
+}
+
+void TestDataManager::measuringCircleBitTakesTheServersPicture()
+{
+    QCOMPARE(control("param MEASURING_CIRCLE_ID paint_drop.svg"), QString("OK"));
+    QTRY_VERIFY_WITH_TIMEOUT(UserParams::getMeasuringCircleID().endsWith("/opt/GUI/Branding/paint_drop.svg"), 3000);
+    QCOMPARE(control("param MEASURING_CIRCLE_ID colour_wheel.svg"), QString("OK"));
+    QTRY_VERIFY_WITH_TIMEOUT(UserParams::getMeasuringCircleID().endsWith("/colour_wheel.svg"), 3000);
 }
 
 void TestDataManager::volumeAndBrightnessBitsTakeTheServersValues()
