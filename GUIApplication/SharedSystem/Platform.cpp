@@ -1,5 +1,8 @@
 #include "SharedSystem/Platform.h"
 
+#include <csignal>
+#include <sys/types.h>
+
 #include <QDebug>
 #include <QDir>
 #include <QMutex>
@@ -89,15 +92,52 @@ int runShellCommand(const QString& command)
 #endif
 }
 
-void startProgram(const QString& program, const QStringList& arguments)
+namespace {
+
+class StartedProcess : public Process
+{
+public:
+    StartedProcess(const QString& line, qint64 pid)
+        : m_line(line)
+        , m_pid(pid)
+    {
+    }
+    ~StartedProcess() override = default;
+
+    void stop() override
+    {
+        if (m_stopped)
+            return;
+        m_stopped = true;
+        record(QStringLiteral("stop ") + m_line);
+#ifdef MARIGOLD_DEVICE_BUILD
+        // A detached child belongs to init once started; its pid is ours to
+        // end. One that has already finished makes this a no-op.
+        if (m_pid > 0)
+            ::kill(pid_t(m_pid), SIGTERM);
+#endif
+    }
+
+private:
+    QString m_line;
+    qint64 m_pid = 0;
+    bool m_stopped = false;
+};
+
+} // namespace
+
+std::unique_ptr<Process> startProcess(const QString& program, const QStringList& arguments)
 {
     const QString line = (QStringList(program) + arguments).join(' ');
     record(line);
+    qint64 pid = 0;
 #ifdef MARIGOLD_DEVICE_BUILD
-    QProcess::startDetached(program, arguments);
+    if (!QProcess::startDetached(program, arguments, QString(), &pid))
+        qDebug() << "Platform: could not start" << line;
 #else
     qDebug() << "Platform: host build, not starting:" << line;
 #endif
+    return std::unique_ptr<Process>(new StartedProcess(line, pid));
 }
 
 QStringList recordedCommands()

@@ -9,6 +9,8 @@
 #include <QString>
 #include <QStringList>
 
+#include <memory>
+
 namespace Platform {
 
 // Root prefix for device paths. Taken from MARIGOLD_ROOT on first use,
@@ -26,9 +28,20 @@ bool isDeviceBuild();
 // Returns the command's exit status on the device and 0 on the host.
 int runShellCommand(const QString& command);
 
-// Starts an external program without waiting for it (aplay). The program's
-// own result is not looked at.
-void startProgram(const QString& program, const QStringList& arguments);
+// A program started by startProcess, which can be stopped again: only that
+// process, not every process of the same name.
+class Process
+{
+public:
+    virtual ~Process() = default;
+    // Ends the process if it still runs; a second call does nothing.
+    virtual void stop() = 0;
+};
+
+// Starts an external program without waiting for it and gives a handle to
+// that one process. A host build records "<program> <arguments>" and, on
+// stop, "stop <program> <arguments>".
+std::unique_ptr<Process> startProcess(const QString& program, const QStringList& arguments);
 
 // What a host build would have run, oldest first ("aplay -N /opt/...").
 QStringList recordedCommands();

@@ -78,7 +78,7 @@ void AudioPlayer::playSoundFile(const QString& file)
     qDebug() << QString("*******Playing sound %1********").arg(file);
     QMutexLocker lock(&m_mutex);
     stopPlaying();
-    Platform::startProgram("aplay", QStringList() << "-N" << Platform::devicePath(file));
+    m_player = Platform::startProcess("aplay", QStringList() << "-N" << Platform::devicePath(file));
     m_playing.start();
 }
 
@@ -101,7 +101,9 @@ bool AudioPlayer::isPlaying() const
 
 void AudioPlayer::stopPlaying()
 {
-    if (m_playing.isValid() && m_playing.elapsed() < kLongestSoundMs)
-        Platform::runShellCommand("killall -q aplay");
+    // Only our own player is ended, and only while its sound can still run.
+    if (m_player && m_playing.isValid() && m_playing.elapsed() < kLongestSoundMs)
+        m_player->stop();
+    m_player.reset();
     m_playing.invalidate();
 }

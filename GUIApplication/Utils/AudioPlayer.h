@@ -7,7 +7,11 @@
 #include "SharedSystem/InstrumentTypes.h"
 #include "SharedSystem/WorkerTask.h"
 
+#include "SharedSystem/Platform.h"
+
 #include <QElapsedTimer>
+
+#include <memory>
 #include <QMutex>
 #include <QObject>
 #include <QString>
@@ -42,6 +46,7 @@ private:
 
     mutable QMutex m_mutex;
     QElapsedTimer m_playing; // since the running sound started; invalid when none
+    std::unique_ptr<Platform::Process> m_player; // the aplay of the running sound
 };
 
 class AudioPlayerTask : public WorkerTask<AudioPlayer>

@@ -52,10 +52,13 @@ private slots:
         Platform::clearRecordedCommands();
         QCOMPARE(Platform::runShellCommand("touch " + marker), 0);
         Platform::runShellCommand("reboot");
-        Platform::startProgram("aplay", {"-N", "/opt/GUI/Sounds/click.wav"});
+        auto player = Platform::startProcess("aplay", {"-N", "/opt/GUI/Sounds/click.wav"});
+        player->stop();
+        player->stop(); // once only
         QVERIFY(!QFile::exists(marker));
         QCOMPARE(Platform::recordedCommands(),
-                 QStringList({"touch " + marker, "reboot", "aplay -N /opt/GUI/Sounds/click.wav"}));
+                 QStringList({"touch " + marker, "reboot", "aplay -N /opt/GUI/Sounds/click.wav",
+                              "stop aplay -N /opt/GUI/Sounds/click.wav"}));
     }
 
     void recordIsBounded()

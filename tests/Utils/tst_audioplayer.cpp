@@ -42,7 +42,7 @@ private slots:
         QVERIFY(player.isPlaying());
         player.playSound(eSoundErrorUser);
         QCOMPARE(Platform::recordedCommands(),
-                 QStringList({aplay("click.wav"), "killall -q aplay", aplay("errorUser.wav")}));
+                 QStringList({aplay("click.wav"), "stop " + aplay("click.wav"), aplay("errorUser.wav")}));
     }
 
     void stoppingStopsOnlyWhatPlays()
@@ -55,11 +55,11 @@ private slots:
         player.stopAllSounds();
         QVERIFY(!player.isPlaying());
         QCOMPARE(Platform::recordedCommands(),
-                 QStringList({aplay("errorApocalypse.wav"), "killall -q aplay"}));
+                 QStringList({aplay("errorApocalypse.wav"), "stop " + aplay("errorApocalypse.wav")}));
 
         player.playSound(eSoundJobComplete);
         player.playSound(eSoundNone); // "no sound" is a stop
-        QCOMPARE(Platform::recordedCommands().last(), QString("killall -q aplay"));
+        QCOMPARE(Platform::recordedCommands().last(), "stop " + aplay("job_finished.wav"));
         QVERIFY(!player.isPlaying());
     }
 
