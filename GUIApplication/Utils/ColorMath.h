@@ -327,6 +327,12 @@ bool_t ColorMath_CalculateCCRDensities(const double* pRefl, const double* PaperR
 double ColorMathHelper_CalculateWeightedRefl(const double* dRefls, int index);
 double ColorMathHelper_CalculateSpecialDensity(const double* dRefls, int index, const double* pWeights, int n);
 double ColorMathHelper_CalculateSpecDensity(const double* dRefls, int index);
+// Candidate absorption peaks for spectral X: the local minima of the
+// smoothed spectrum, as indices; returns how many were written (at most max).
+int ColorMathHelper_FindMaxDensityPoints(const double* dRefls, int* pIndices, int max);
+// Of several candidates, the one with the widest absorbing band (values
+// within the minimum tolerance of its bottom); the deepest wins a tie.
+int ColorMathHelper_ChooseBPWavelen(const double* dRefls, const int* pIndices, int count);
 void ColorMath_GetSpectralXConstants(double* pMinTolerance, double* pChromaticTolerance, double* pWeights);
 bool_t ColorMath_DensityMinusPaperToHueGrayDirection(const double* pCMY, const double* pPaperCMY,
                                                      double* pGrayness, double* pHueError, int* eRetDir);

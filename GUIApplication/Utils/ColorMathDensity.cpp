@@ -87,31 +87,60 @@ double specialDensity(const double* refl, int index, const double* weights, int 
     return -log10S(sum / (wsum * 100.0));
 }
 
-// The index of the strongest absorption for spectral X: among the local
-// minima of the smoothed reflectance, the one whose absorbing band (values
-// within 2 percent of its minimum) is widest; the deepest wins a tie.
-int spectralXIndex(const double* refl)
+double bandTolerance()
 {
-    double smoothed[NUM_WAVELENGTHS];
-    for (int i = 0; i < NUM_WAVELENGTHS; ++i)
-        smoothed[i] = weightedRefl(refl, i);
-    // The weights of the smoothing add up to 2.2.
-    const double band = 2.0 * 2.2;
+    // The minimum tolerance, on the smoothing's scale (its weights add up to 2.2).
+    return 2.0 * 2.2;
+}
+
+} // namespace
+
+int ColorMathHelper_FindMaxDensityPoints(const double* dRefls, int* pIndices, int max)
+{
+    if (!dRefls || !pIndices || max <= 0)
+        return 0;
+    int found = 0;
+    for (int i = 2; i <= NUM_WAVELENGTHS - 3 && found < max; ++i) {
+        const double here = weightedRefl(dRefls, i);
+        if (here <= weightedRefl(dRefls, i - 1) && here <= weightedRefl(dRefls, i + 1))
+            pIndices[found++] = i;
+    }
+    return found;
+}
+
+int ColorMathHelper_ChooseBPWavelen(const double* dRefls, const int* pIndices, int count)
+{
+    if (!dRefls || !pIndices || count <= 0)
+        return -1;
     int best = -1, bestWidth = -1;
-    for (int i = 2; i <= NUM_WAVELENGTHS - 3; ++i) {
-        if (smoothed[i] > smoothed[i - 1] || smoothed[i] > smoothed[i + 1])
+    double bestDepth = 0.0;
+    for (int k = 0; k < count; ++k) {
+        const int i = pIndices[k];
+        if (i < 0 || i >= NUM_WAVELENGTHS)
             continue;
+        const double bottom = weightedRefl(dRefls, i);
         int width = 1;
-        for (int j = i - 1; j >= 0 && smoothed[j] - smoothed[i] <= band; --j)
+        for (int j = i - 1; j >= 0 && weightedRefl(dRefls, j) - bottom <= bandTolerance(); --j)
             ++width;
-        for (int j = i + 1; j < NUM_WAVELENGTHS && smoothed[j] - smoothed[i] <= band; ++j)
+        for (int j = i + 1; j < NUM_WAVELENGTHS && weightedRefl(dRefls, j) - bottom <= bandTolerance(); ++j)
             ++width;
-        if (width > bestWidth || (width == bestWidth && smoothed[i] < smoothed[best])) {
+        if (width > bestWidth || (width == bestWidth && bottom < bestDepth)) {
             best = i;
             bestWidth = width;
+            bestDepth = bottom;
         }
     }
     return best;
+}
+
+namespace {
+
+// The index of the strongest absorption for spectral X.
+int spectralXIndex(const double* refl)
+{
+    int peaks[NUM_WAVELENGTHS];
+    const int n = ColorMathHelper_FindMaxDensityPoints(refl, peaks, NUM_WAVELENGTHS);
+    return n == 1 ? peaks[0] : ColorMathHelper_ChooseBPWavelen(refl, peaks, n);
 }
 
 bool hasRows(int status)
