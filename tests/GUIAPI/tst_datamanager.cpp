@@ -26,6 +26,7 @@ private slots:
     void languageBitChangesTheLanguage();
     void volumeAndBrightnessBitsTakeTheServersValues();
     void wifiReadFailureLeavesNoStaleNetworks();
+    void wifiBitsReReadTheNetworksAndTellTheScreens();
     void measuringCircleBitTakesTheServersPicture();
     void textMessageIsShownEveryTime();
     void averagingDefaultsFollowTheServer();
@@ -192,7 +193,7 @@ void TestDataManager::languageBitChangesTheLanguage()
 
 void TestDataManager::wifiReadFailureLeavesNoStaleNetworks()
 {
-    QCOMPARE(control("wifi on"), QString("OK"));
+    QTRY_COMPARE_WITH_TIMEOUT(control("wifi on"), QString("OK"), 5000); // busy a moment after a switch
     QCOMPARE(control("wifi network Bodyshop-Guest in 0.7 OPEN"), QString("OK"));
     onDataManagerThread([this] { m_dm->onLoadWifiSettings(); });
     const auto all = [this] { return m_dm->getKnownNetworkDescriptions() + m_dm->getUnknownNetworkDescriptions(); };
@@ -206,7 +207,32 @@ void TestDataManager::wifiReadFailureLeavesNoStaleNetworks()
     onDataManagerThread([this] { m_dm->onLoadWifiSettings(); });
     QVERIFY(!all().isEmpty());
     QCOMPARE(control("wifi network Bodyshop-Guest out"), QString("OK"));
-    QCOMPARE(control("wifi off"), QString("OK"));
+    QTRY_COMPARE_WITH_TIMEOUT(control("wifi off"), QString("OK"), 5000);
+}
+
+void TestDataManager::wifiBitsReReadTheNetworksAndTellTheScreens()
+{
+    QSignalSpy changed(m_dm, &DataManager::wifiSettingsChanged);
+    QTRY_COMPARE_WITH_TIMEOUT(control("wifi on"), QString("OK"), 5000); // busy a moment after a switch
+    const auto names = [this] {
+        QStringList ssids;
+        for (const NETWORK_DESCRIPTION_T& n : m_dm->getKnownNetworkDescriptions() + m_dm->getUnknownNetworkDescriptions())
+            ssids << n.SSID;
+        return ssids;
+    };
+    // A network coming on the air (the scan-results bit) is read without
+    // anyone asking for the list.
+    QCOMPARE(control("wifi network Spraybooth-2 in 0.6 OPEN"), QString("OK"));
+    QTRY_VERIFY_WITH_TIMEOUT(names().contains("Spraybooth-2"), 5000);
+    QVERIFY(changed.count() >= 1);
+    // The settings bit alone tells the screens too.
+    const int before = changed.count();
+    QCOMPARE(control("wifi static 10.20.30.40"), QString("OK"));
+    QTRY_VERIFY_WITH_TIMEOUT(changed.count() >= before + 2, 5000); // 0x20 and the list bit
+    QCOMPARE(control("wifi network Spraybooth-2 out"), QString("OK"));
+    QTRY_VERIFY_WITH_TIMEOUT(!names().contains("Spraybooth-2"), 5000);
+    QCOMPARE(control("wifi dhcp"), QString("OK"));
+    QTRY_COMPARE_WITH_TIMEOUT(control("wifi off"), QString("OK"), 5000);
 }
 
 void TestDataManager::measuringCircleBitTakesTheServersPicture()
