@@ -80,4 +80,10 @@ void hidePointer()
     QApplication::setOverrideCursor(QCursor(blank));
 }
 
+void pinTimeZone()
+{
+    if (qEnvironmentVariableIsEmpty("TZ"))
+        qputenv("TZ", ":/etc/localtime");
+}
+
 } // namespace AppShell

@@ -10,6 +10,11 @@ namespace AppShell {
 
 // argv as a list, program name first. Exactly one argument of the form
 // "address:port" selects the server; anything else keeps the defaults.
+// Without TZ, glibc reads /etc/localtime again on every local time
+// conversion, which a job list of some thousand samples feels. Sets TZ to
+// that file when it is unset; call before any thread starts.
+void pinTimeZone();
+
 void applyAddressArgument(const QStringList& arguments);
 
 // "1.0.<revision> <date> <time>", no line end. The revision is the last

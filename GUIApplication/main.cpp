@@ -12,10 +12,7 @@
 
 int main(int argc, char* argv[])
 {
-    // Without TZ glibc reads /etc/localtime again on every local time
-    // conversion, which a job list of some thousand samples feels.
-    if (qEnvironmentVariableIsEmpty("TZ"))
-        qputenv("TZ", ":/etc/localtime");
+    AppShell::pinTimeZone();
 
     // 1, 2
     MyApplication app(argc, argv);

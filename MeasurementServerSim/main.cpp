@@ -14,6 +14,10 @@
 
 int main(int argc, char* argv[])
 {
+    // Readings carry local times; without TZ glibc stats /etc/localtime on
+    // every conversion.
+    if (qEnvironmentVariableIsEmpty("TZ"))
+        qputenv("TZ", ":/etc/localtime");
     QCoreApplication app(argc, argv);
     // Text on the wire is UTF-8, as on the instrument.
     QTextCodec::setCodecForLocale(QTextCodec::codecForName("UTF-8"));

@@ -93,6 +93,8 @@ QString control(quint16 port, const QString& line)
 
 int main(int argc, char** argv)
 {
+    // The program's own start-up choice, so that the figures are its own.
+    AppShell::pinTimeZone();
     qputenv("QT_QPA_PLATFORM", qgetenv("QT_QPA_PLATFORM").isEmpty() ? QByteArray("offscreen") : qgetenv("QT_QPA_PLATFORM"));
     QApplication app(argc, argv);
     qInstallMessageHandler([](QtMsgType, const QMessageLogContext&, const QString&) {});
