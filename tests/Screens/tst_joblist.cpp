@@ -46,11 +46,13 @@ QList<SCREEN_ID_T>& requestedScreens()
     return ids;
 }
 
+// Lines that contain `part`, leaving out the stops of a sound: a played
+// sound is counted once, whether or not a later one cut it.
 int count(const QStringList& lines, const QString& part)
 {
     int n = 0;
     for (const QString& line : lines)
-        n += line.contains(part) ? 1 : 0;
+        n += line.contains(part) && !line.startsWith(QLatin1String("stop ")) ? 1 : 0;
     return n;
 }
 
@@ -590,7 +592,8 @@ void tst_JobList::deletedRowKeepsItsNeighbourInView()
     DataManager::instance()->setActiveJob(jobIndex);
     home()->onDeleteJobConfirmed();
     QTRY_VERIFY_WITH_TIMEOUT(home()->getNumCompletedJobs() == 11, 10000);
-    QVERIFY(rowVisible(list, jobIndex + 1));
+    // The scroll follows the list's layout, which a slow build runs later.
+    QTRY_VERIFY_WITH_TIMEOUT(rowVisible(list, jobIndex + 1), 5000);
     QVERIFY(list->verticalScrollBar()->value() > 0);
 }
 
