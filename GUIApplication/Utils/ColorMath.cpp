@@ -2,6 +2,7 @@
 
 #include "SharedSystem/WeightTables.h"
 #include "Utils/ColorMathHelper.h"
+#include "Utils/ColorMathInternal.h"
 
 #include <cmath>
 #if defined(__SSE2__)
@@ -27,21 +28,11 @@ const float s_HunterKb[eILLUM_OBS_NumOf] = {
 
 namespace {
 
-const double kErrorValue = -999.0;
+using namespace ColorMathInternal;
 
 // Threshold of the linear part of L*, held in double.
 const double kEpsilon = 0.008856;
 const float kOneThird = 0.33333334f;
-
-bool validPair(int illumobsnr)
-{
-    return illumobsnr >= 0 && illumobsnr < eILLUM_OBS_NumOf;
-}
-
-const XYZN_T& whitePoint(int illumobsnr)
-{
-    return pXYZN.load()[illumobsnr];
-}
 
 // The L*a*b* companding function.
 double labF(double v)

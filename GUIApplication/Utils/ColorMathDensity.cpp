@@ -4,6 +4,7 @@
 // other status is refused before any table is touched.
 
 #include "Utils/ColorMath.h"
+#include "Utils/ColorMathInternal.h"
 
 #include <QtGlobal>
 
@@ -12,11 +13,10 @@
 
 namespace {
 
-const double kErrorValue = -999.0;
+using namespace ColorMathInternal;
+
 const double kSpectralXWeights[5] = {0.1, 0.5, 1.0, 0.5, 0.1};
 
-double log10S(double v) { return double(log10f(float(v))); }
-double pow10S(double v) { return double(powf(10.0f, float(v))); }
 
 // The 31 weights of a status and response, or null where we have none.
 const int32_t* weightRow(int status, int response)

@@ -6,23 +6,20 @@
 
 #include "Utils/ColorMath.h"
 #include "Utils/ColorMathHelper.h"
+#include "Utils/ColorMathInternal.h"
 
 #include <cmath>
 
 namespace {
 
-const double kErrorValue = -999.0;
+using namespace ColorMathInternal;
+
 const double kCmcError = 999.0;
 const double kPi = 3.1415927410125732;
 const double kDegToRad = 0.01745329238474369;
 // 25^7 as a float.
 const double k25Pow7 = 6103515648.0;
 
-double sqrtS(double v) { return double(sqrtf(float(v))); }
-double cosS(double v) { return double(cosf(float(v))); }
-double sinS(double v) { return double(sinf(float(v))); }
-double expS(double v) { return double(expf(float(v))); }
-double powS(double v, double e) { return double(powf(float(v), float(e))); }
 
 // A hue difference folded once into -180 to 180.
 double wrapHue(double d)

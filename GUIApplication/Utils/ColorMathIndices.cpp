@@ -6,6 +6,7 @@
 
 #include "Utils/ColorMath.h"
 #include "Utils/ColorMathHelper.h"
+#include "Utils/ColorMathInternal.h"
 
 #include "SharedSystem/WeightTables.h"
 
@@ -21,21 +22,9 @@ const float asISOR457_Filter[NUM_WAVELENGTHS] = {
 
 namespace {
 
-const double kErrorValue = -999.0;
+using namespace ColorMathInternal;
 
-bool validPair(int illumobsnr)
-{
-    return illumobsnr >= 0 && illumobsnr < eILLUM_OBS_NumOf;
-}
 
-const XYZN_T& whitePoint(int illumobsnr)
-{
-    return pXYZN.load()[illumobsnr];
-}
-
-double sqrtS(double v) { return double(sqrtf(float(v))); }
-double logS(double v) { return double(logf(float(v))); }
-double expS(double v) { return double(expf(float(v))); }
 
 // Kubelka-Munk K/S of a reflectance in percent.
 double kOverS(double reflPercent)
