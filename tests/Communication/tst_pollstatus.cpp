@@ -21,6 +21,10 @@ namespace {
 const quint32 kGetState = 0x10000000;
 const quint32 kTriggerMeasurement = 0x41000000;
 const quint32 kGetSelfTestResult = 0x60000102;
+const quint32 kTriggerCalibration = 0x60000021;
+// The reference check is started with the measurement trigger.
+const quint32 kTriggerReferenceCheck = kTriggerMeasurement;
+const int kRefusal = 2028;
 // Offset of the first payload byte of a reply: the system state of a state.
 const int kReplyPayload = CmdData::RESPONSE_HEADER_SIZE;
 
@@ -44,6 +48,9 @@ private slots:
     void measurementRunsMeasurementAndKillTimersUntilTheServerIsBackAtRest();
     void measurementNeverSeenBusyEndsWithGoHomeAfter25Seconds();
     void calibrationWithErrorsPendingEndsWithoutCompletion();
+    void calibrationAndReferenceTriggersAreRetriedUntilTheServerTakesThem();
+    void refusedCalibrationGivesUpAfterSixSecondsAndWaitsAtRest();
+    void referenceCheckPollCompletesWhetherThePanelPassesOrNot();
     void selfTestEndsAtOnceWhenItsResultComesWhileBusy();
     void targetingPollReportsPressureImageAndOrientationInThatOrder();
     void lostLinkStopsEveryPoll();
@@ -85,6 +92,7 @@ void TestPollStatus::initTestCase()
     m_log.watch(hub, &API_SignalMaster::MeasurementComplete, "MeasurementComplete");
     m_log.watch(hub, &API_SignalMaster::MeasurementIssue, "MeasurementIssue");
     m_log.watch(hub, &API_SignalMaster::CalibrationComplete, "CalibrationComplete");
+    m_log.watch(hub, &API_SignalMaster::ReferenceCheckComplete, "ReferenceCheckComplete");
     m_log.watch(hub, &API_SignalMaster::SelfTestTestComplete, "SelfTestTestComplete");
     m_log.watch(hub, &API_SignalMaster::GoHome, "GoHome");
     m_log.watch(hub, &API_SignalMaster::PressureSwitchesUpdated, "PressureSwitchesUpdated");
@@ -109,6 +117,9 @@ void TestPollStatus::cleanup()
     m_hideBusy = false;
     m_selfTestResult = -1;
     m_sim->control("refuse off");
+    m_sim->control("refcheck auto");
+    if (m_dm->getPollStatus()->activeTimers() != idle())
+        API_SignalMaster::instance()->emitTriggerResumeIdle();
 }
 
 void TestPollStatus::idlePollReportsTheStateTwiceASecond()
@@ -167,6 +178,61 @@ void TestPollStatus::calibrationWithErrorsPendingEndsWithoutCompletion()
 
     MeasAPI_TriggerUserCalibration();
     QVERIFY(m_log.waitFor("CalibrationComplete", 15000));
+    QVERIFY(pollerIs(idle()));
+}
+
+void TestPollStatus::calibrationAndReferenceTriggersAreRetriedUntilTheServerTakesThem()
+{
+    QCOMPARE(m_sim->control(QString("refuse %1 %2 2").arg(kTriggerCalibration).arg(kRefusal)), QString("OK"));
+    MeasAPI_TriggerUserCalibration();
+    QVERIFY(m_log.waitFor("CalibrationComplete", 15000));
+    // Every refusal reaches the screens (as the front's bad-status code), the
+    // third try went through.
+    QCOMPARE(m_log.countStartingWith("MeasurementIssue("), 2);
+    QVERIFY(pollerIs(idle()));
+
+    m_log.clear();
+    QCOMPARE(m_sim->control(QString("refuse %1 %2 3").arg(kTriggerReferenceCheck).arg(kRefusal)), QString("OK"));
+    MeasAPI_TriggerReferenceCheck();
+    QVERIFY(m_log.waitFor("ReferenceCheckComplete", 15000));
+    QCOMPARE(m_log.countStartingWith("MeasurementIssue("), 3);
+    QVERIFY(pollerIs(idle()));
+}
+
+void TestPollStatus::refusedCalibrationGivesUpAfterSixSecondsAndWaitsAtRest()
+{
+    QCOMPARE(m_sim->control(QString("refuse %1 %2").arg(kTriggerCalibration).arg(kRefusal)), QString("OK"));
+    QElapsedTimer clock;
+    clock.start();
+    MeasAPI_TriggerUserCalibration();
+    QVERIFY(pollerIs({"calibrate"}, 15000));
+    const qint64 elapsed = clock.elapsed();
+    QVERIFY2(elapsed >= 5900 && elapsed < 10000, qPrintable(QString::number(elapsed)));
+
+    // Nothing was started, so the calibration poll sits at rest and never
+    // completes; only a resume brings the idle poll back.
+    settle(1000);
+    QCOMPARE(m_dm->getPollStatus()->activeTimers(), QStringList{"calibrate"});
+    QCOMPARE(m_log.count("CalibrationComplete"), 0);
+    // One try every 50 ms or so, for six seconds.
+    const int refusals = m_log.countStartingWith("MeasurementIssue(");
+    QVERIFY2(refusals >= 10, qPrintable(QString::number(refusals)));
+}
+
+void TestPollStatus::referenceCheckPollCompletesWhetherThePanelPassesOrNot()
+{
+    QCOMPARE(m_sim->control("refcheck fail"), QString("OK"));
+    MeasAPI_TriggerReferenceCheck();
+    QVERIFY(pollerIs({"reference"}));
+    QVERIFY(m_log.waitFor("ReferenceCheckComplete", 15000));
+    QCOMPARE(m_log.count("MeasurementIssue(-2)"), 1);
+    QVERIFY(pollerIs(idle()));
+
+    m_log.clear();
+    QCOMPARE(m_sim->control("refcheck pass"), QString("OK"));
+    MeasAPI_TriggerReferenceCheck();
+    QVERIFY(m_log.waitFor("ReferenceCheckComplete", 15000));
+    QCOMPARE(m_log.count("MeasurementIssue(-2)"), 0);
     QVERIFY(pollerIs(idle()));
 }
 

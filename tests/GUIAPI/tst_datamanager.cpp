@@ -7,7 +7,9 @@
 #include "GUIAPI/API_SignalMaster.h"
 #include "GUIAPI/DataManager.h"
 #include "GUIAPI/MeasureAPI.h"
+#include "Communication/PollStatus.h"
 #include "SharedSystem/Instrument.h"
+#include "SharedSystem/Platform.h"
 #include "SharedSystem/UserParams.h"
 
 #include <QtTest>
@@ -46,6 +48,10 @@ private slots:
 
     void createdJobsAreNamedJobThenJobDashN();
     void copyTakesNameNAndDisplayNameN();
+
+    // These drive the status by hand, with the poll stopped.
+    void jobChangeReReadsTheActiveJobAloneUnlessAnotherJobSaysItChanged();
+    void filterBitReloadsTheFiltersAndReportsAFileThatWillNotParse();
 
 private:
     QString control(const QString& line) { return m_sim->control(line); }
@@ -581,6 +587,149 @@ void TestDataManager::copyTakesNameNAndDisplayNameN()
     QCOMPARE(m_dm->getAJobObject(second).getName(), QString("Job 2"));
     QCOMPARE(m_dm->getAJobObject(second).getDisplayName(), QString("Panel 4"));
     QCOMPARE(onDataManagerThread([this] { return m_dm->copyJob(NO_INDEX); }), NO_INDEX);
+}
+
+// ---------------------------------------------------------------- hand-made status
+
+namespace {
+
+// Stops the status poll for the length of a test, so that only the statuses
+// the test hands over are processed.
+class PollPause
+{
+public:
+    explicit PollPause(DataManager* dm)
+        : m_dm(dm)
+    {
+        QMetaObject::invokeMethod(dm->getPollStatus(), "onStopPolling", Qt::BlockingQueuedConnection);
+        stopped = dm->getPollStatus()->activeTimers().isEmpty();
+    }
+    ~PollPause() { API_SignalMaster::instance()->emitTriggerResumeIdle(); }
+    bool stopped = false;
+
+private:
+    DataManager* m_dm;
+};
+
+SystemStatus::EntityChange jobEntity(const QString& name, int change = 2)
+{
+    SystemStatus::EntityChange e;
+    e.entity = 1007;
+    e.identifier1 = name;
+    e.change = change;
+    return e;
+}
+
+} // namespace
+
+void TestDataManager::jobChangeReReadsTheActiveJobAloneUnlessAnotherJobSaysItChanged()
+{
+    const auto newJob = [this] {
+        const unsigned int index = onDataManagerThread([this] { return m_dm->createNewJob(); });
+        return index == NO_INDEX ? QString() : m_dm->getAJobObject(index).getName();
+    };
+    const QString active = newJob();
+    const QString other = newJob();
+    QVERIFY(!active.isEmpty() && !other.isEmpty());
+    PollPause pause(m_dm);
+    QVERIFY(pause.stopped);
+    const auto stateOf = [this](const QString& name) {
+        return m_dm->getAJobObject(m_dm->findJobByName(name)).getJobState();
+    };
+    const int activeBefore = stateOf(active);
+    const int otherBefore = stateOf(other);
+    const int forced = 2003;
+    QVERIFY(m_dm->findJobByName(other) != NO_INDEX);
+    QVERIFY(activeBefore != forced && otherBefore != forced);
+    m_dm->setActiveJob(m_dm->findJobByName(active));
+    m_dm->setFullJobUpdateFlag(false);
+    // Both jobs change on the server; the GUI learns only that jobs changed.
+    m_sim->call([&](Sim::Server& s) {
+        s.instrument().jobs().setState(active, forced);
+        s.instrument().jobs().setState(other, forced);
+    });
+    const auto process = [this](const SystemStatus& status) {
+        onDataManagerThread([&] {
+            m_dm->setSystemStatus(status);
+            return 0;
+        });
+    };
+    SystemStatus status = m_dm->getSystemStatus();
+    status.setJobID(short(status.getJobID() + 1));
+    status.setEntityChanges({});
+    process(status);
+    QCOMPARE(stateOf(active), forced);
+    QCOMPARE(stateOf(other), otherBefore);
+
+    // Changes of other kinds or entities are not about jobs.
+    status.setEntityChanges({jobEntity(other, 1), {1006, other, 2}, jobEntity(active)});
+    process(status);
+    QCOMPARE(stateOf(other), otherBefore);
+
+    // Another job's own change brings the whole list in.
+    status.setEntityChanges({jobEntity(other)});
+    process(status);
+    QCOMPARE(stateOf(other), forced);
+    QCOMPARE(m_dm->getActiveJobObject().getName(), active);
+
+    m_sim->call([&](Sim::Server& s) {
+        s.instrument().jobs().setState(active, activeBefore);
+        s.instrument().jobs().setState(other, otherBefore);
+    });
+    m_dm->setFullJobUpdateFlag(true);
+    onDataManagerThread([this] { return m_dm->refreshJobInfos(); });
+}
+
+void TestDataManager::filterBitReloadsTheFiltersAndReportsAFileThatWillNotParse()
+{
+    PollPause pause(m_dm);
+    QVERIFY(pause.stopped);
+    // A device tree of this test's own, so that the shared one stays whole.
+    const QString stagedRoot = Platform::root();
+    const QString root = TestSupport::makeTempDir("filter-root");
+    QVERIFY(QDir(root).mkpath("opt/Filter"));
+    for (const char* name : {"Filter.xml", "FilterTranslation.xml", "FilterSchema.xsd", "TranslationSchema.xsd"}) {
+        const QString path = QString("/opt/Filter/") + name;
+        QVERIFY(QFile::copy(Platform::devicePath(path), root + path));
+    }
+    Platform::setRoot(root);
+    const QString filter = Platform::devicePath("/opt/Filter/Filter.xml");
+    const QString translation = Platform::devicePath("/opt/Filter/FilterTranslation.xml");
+
+    SystemStatus status = m_dm->getSystemStatus();
+    status.setEntityChanges({});
+    status.setUSettingsBits(0x10);
+    const auto process = [this, &status] {
+        onDataManagerThread([&] {
+            m_dm->setSystemStatus(status);
+            return 0;
+        });
+    };
+    // The filter tree of a paint maker: make, model, colour code.
+    process();
+    QVERIFY(onDataManagerThread([this] { return m_dm->doesTagExist(); }));
+    QCOMPARE(m_log.countStartingWith("MeasurementIssue"), 0);
+
+    // A file cut off in the middle: the operator is told, nothing hangs.
+    QFile broken(filter);
+    QVERIFY(broken.open(QIODevice::WriteOnly | QIODevice::Truncate));
+    broken.write("<?xml version=\"1.0\"?><Filters><Filter Name=\"Make\"><Entry");
+    broken.close();
+    process();
+    QVERIFY(m_log.waitFor("MeasurementIssue(-92934)", 3000));
+
+    // No file at all is the same issue.
+    QFile::remove(filter);
+    QFile::remove(translation);
+    m_log.clear();
+    process();
+    QVERIFY(m_log.waitFor("MeasurementIssue(-92934)", 3000));
+    // Without the bit the filters are left alone.
+    m_log.clear();
+    status.setUSettingsBits(0);
+    process();
+    QCOMPARE(m_log.countStartingWith("MeasurementIssue"), 0);
+    Platform::setRoot(stagedRoot);
 }
 
 QTEST_MAIN(TestDataManager)
