@@ -36,6 +36,8 @@ const int kManyJobs = 51;
 const int kRowBurst = 50;
 // Rows of the complete list above the first job.
 const int kCompleteRowOffset = 2;
+// The size of a row's form: the rows are laid out before they are made.
+const QSize kRowSize(320, 85);
 // The walk for the row to keep in view after a delete starts here.
 const int kFirstWalkedRow = 5;
 // The instrument needs this long at most to settle after a measurement or a
@@ -58,6 +60,7 @@ JobListScreen::JobListScreen(QWidget* parent)
     , m_jobQuickItem(nullptr)
     , m_pWebSyncButton(nullptr)
     , m_WebSyncButtonIndex(1)
+    , m_rowsCreated(0)
     , m_calScreenShown(false)
 {
     for (auto& pair : m_selectionItems)
@@ -84,6 +87,8 @@ JobListScreen::JobListScreen(QWidget* parent)
     connect(data, &DataManager::updateWifiState, this, &JobListScreen::onWifiStateChanged);
     connect(&m_initTimer, &QTimer::timeout, this, &JobListScreen::onInit);
     connect(ui->StatusBarBtn, &QPushButton::clicked, this, &DaddyPanel::onStatusBarBtn_clicked);
+    ui->JobList->setRowFactory([this](int row) { return makeRow(row, false); });
+    ui->JobListComplete->setRowFactory([this](int row) { return makeRow(row - kCompleteRowOffset, true); });
 
     onUpdateTitleBar();
     onUpdateTabTitles();
@@ -115,8 +120,12 @@ JobListScreen::~JobListScreen()
 
 JobListSelectionItem* JobListScreen::rowOf(int jobIndex, bool complete) const
 {
-    if (jobIndex < 0 || jobIndex >= kMaxJobRows)
+    if (jobIndex < 0 || jobIndex >= m_rowsCreated)
         return nullptr;
+    if (complete)
+        ui->JobListComplete->makeRow(jobIndex + kCompleteRowOffset);
+    else
+        ui->JobList->makeRow(jobIndex);
     return m_selectionItems[size_t(jobIndex)][complete ? 1 : 0];
 }
 
@@ -164,23 +173,39 @@ void JobListScreen::SetActiveStatus(bool active)
 
 void JobListScreen::createRows(int jobIndex)
 {
-    JobListSelectionItem* open = new JobListSelectionItem(jobIndex);
-    connect(open, &JobListSelectionItem::deleteJob, this, &JobListScreen::onDeleteJob);
-    connect(open, &JobListSelectionItem::jobClicked, this, &JobListScreen::onJobClicked);
-    connect(open, &JobListSelectionItem::startJob, this, &JobListScreen::onStartJob);
-    connect(open, &QPushButton::clicked, this, &JobListScreen::onSelectedJob);
-
-    JobListSelectionItem* complete = new JobListSelectionItem(jobIndex);
-    connect(complete, &JobListSelectionItem::deleteJob, this, &JobListScreen::onDeleteJob);
-    connect(complete, &JobListSelectionItem::jobClicked, this, &JobListScreen::onJobClicked);
-    connect(complete, &JobListSelectionItem::startJob, this, &JobListScreen::onStartJob);
-    connect(complete, &QPushButton::clicked, this, &JobListScreen::onJobClicked);
-
-    m_selectionItems[size_t(jobIndex)] = {open, complete};
-    ui->JobList->addWidget(open);
+    // Only the places: a row's widget is made when it first comes near the
+    // view, so that hundreds of jobs list at once.
+    ui->JobList->addDeferredRow(kRowSize);
     ui->JobList->setRowHidden(ui->JobList->count() - 1, true);
-    ui->JobListComplete->addWidget(complete);
+    ui->JobListComplete->addDeferredRow(kRowSize);
     ui->JobListComplete->setRowHidden(ui->JobListComplete->count() - 1, true);
+    m_rowsCreated = jobIndex + 1;
+}
+
+JobListSelectionItem* JobListScreen::makeRow(int jobIndex, bool complete)
+{
+    if (jobIndex < 0 || jobIndex >= m_rowsCreated)
+        return nullptr;
+    JobListSelectionItem* row = new JobListSelectionItem(jobIndex);
+    connect(row, &JobListSelectionItem::deleteJob, this, &JobListScreen::onDeleteJob);
+    connect(row, &JobListSelectionItem::jobClicked, this, &JobListScreen::onJobClicked);
+    connect(row, &JobListSelectionItem::startJob, this, &JobListScreen::onStartJob);
+    if (complete)
+        connect(row, &QPushButton::clicked, this, &JobListScreen::onJobClicked);
+    else
+        connect(row, &QPushButton::clicked, this, &JobListScreen::onSelectedJob);
+    m_selectionItems[size_t(jobIndex)][complete ? 1 : 0] = row;
+    fillRow(row, jobIndex, DataManager::instance()->getSystemStatus().getWifiState());
+    return row;
+}
+
+void JobListScreen::fillRow(JobListSelectionItem* row, int jobIndex, WIFI_STATUS_T wifi)
+{
+    if (!row || jobIndex >= m_rowJobs.size())
+        return;
+    row->setJob(m_rowJobs[jobIndex]);
+    row->onUpdateFields();
+    row->onWifiStateChanged(wifi);
 }
 
 void JobListScreen::onUpdateScreen()
@@ -204,9 +229,10 @@ void JobListScreen::onUpdateScreen()
     else
         onCloseSyncScreen();
 
+    m_rowJobs = jobs;
     const int yieldEvery = qMax(1, n / 8);
     for (int i = 0; i < n; ++i) {
-        if (!m_selectionItems[size_t(i)][0])
+        if (i >= m_rowsCreated)
             createRows(i);
         if (many && i % yieldEvery == 0)
             QCoreApplication::processEvents();
@@ -228,16 +254,12 @@ void JobListScreen::onUpdateScreen()
                 ++m_numCompletedJobs;
                 ui->JobListComplete->setRowHidden(completeRow, false);
                 ui->JobList->setRowHidden(i, true);
-                complete->setJob(job);
-                complete->onUpdateFields();
-                complete->onWifiStateChanged(wifi);
+                fillRow(complete, i, wifi);
             } else {
                 ++m_numOpenJobs;
                 ui->JobListComplete->setRowHidden(completeRow, true);
                 ui->JobList->setRowHidden(i, false);
-                open->setJob(job);
-                open->onUpdateFields();
-                open->onWifiStateChanged(wifi);
+                fillRow(open, i, wifi);
             }
         } else if (i < ui->JobList->count()) {
             ui->JobList->setRowHidden(i, true);
@@ -524,8 +546,8 @@ void JobListScreen::onDeleteJobConfirmed()
     const int active = int(DataManager::instance()->getActiveJob());
     const int rows = ui->JobListComplete->count();
     for (int row = kFirstWalkedRow; row < rows; ++row) {
-        const JobListSelectionItem* item = qobject_cast<JobListSelectionItem*>(ui->JobListComplete->getWidget(row));
-        if (item && item->getJobIndex() == active) {
+        // Complete rows stand in job order after the two fixed rows, made or not.
+        if (row - kCompleteRowOffset == active) {
             m_currentlyViewingJob = row - 1;
             break;
         }

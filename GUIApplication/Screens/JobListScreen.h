@@ -3,9 +3,11 @@
 
 #include "Screens/DaddyPanel.h"
 #include "SharedSystem/InstrumentTypes.h"
+#include "SharedSystem/Job.h"
 
 #include <QString>
 #include <QTimer>
+#include <QVector>
 
 #include <array>
 
@@ -37,8 +39,8 @@ public:
     int getNumCompletedJobs() const { return m_numCompletedJobs; }
     bool isShowingCompleted() const { return m_showCompleted; }
     bool isReady() const { return m_ready; }
-    // The row of job index i in the open (false) or complete (true) list;
-    // null before the job's rows were made.
+    // The row of job index i in the open (false) or complete (true) list,
+    // made now if it had not come into view yet; null past the jobs listed.
     JobListSelectionItem* rowOf(int jobIndex, bool complete) const;
 
     using DaddyPanel::onClosePopup;
@@ -96,6 +98,8 @@ protected:
 private:
     void setButtonState(QPushButton* button, bool selected);
     void createRows(int jobIndex);
+    JobListSelectionItem* makeRow(int jobIndex, bool complete);
+    void fillRow(JobListSelectionItem* row, int jobIndex, WIFI_STATUS_T wifi);
     PopupPanel* showFullPopup(const QString& text);
 
     Ui::JobListScreen* ui;
@@ -107,6 +111,9 @@ private:
     int m_numOpenJobs;
     int m_currentlyViewingJob;
     std::array<std::array<JobListSelectionItem*, 2>, kMaxJobRows> m_selectionItems;
+    // What each row shows, kept for rows that are made later.
+    QVector<Job> m_rowJobs;
+    int m_rowsCreated;
     JobListQuickSelectionItem* m_jobQuickItem;
     WebSyncButton* m_pWebSyncButton;
     int m_WebSyncButtonIndex;

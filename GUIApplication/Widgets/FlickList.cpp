@@ -135,6 +135,86 @@ QWidget* FlickList::getWidget(int index) const
     return itemWidget(item(index));
 }
 
+void FlickList::setRowFactory(RowFactory factory)
+{
+    m_rowFactory = std::move(factory);
+}
+
+void FlickList::addDeferredRow(const QSize& size)
+{
+    auto* item = new QListWidgetItem;
+    item->setSizeHint(size);
+    addItem(item);
+}
+
+QWidget* FlickList::makeRow(int row)
+{
+    if (row < 0 || row >= count())
+        return nullptr;
+    QListWidgetItem* it = item(row);
+    if (QWidget* made = itemWidget(it))
+        return made;
+    if (!m_rowFactory)
+        return nullptr;
+    QWidget* widget = m_rowFactory(row);
+    if (widget)
+        setItemWidget(it, widget);
+    return widget;
+}
+
+int FlickList::madeRowCount() const
+{
+    int made = 0;
+    for (int row = 0; row < count(); ++row)
+        made += itemWidget(item(row)) ? 1 : 0;
+    return made;
+}
+
+void FlickList::makeRowsNearView()
+{
+    if (!m_rowFactory || m_makingRows || !isVisible())
+        return;
+    m_makingRows = true;
+    // A screen's worth either side, so that a flick finds its rows made.
+    const QRect view = viewport()->rect();
+    const QRect near = m_orientation == Qt::Vertical ? view.adjusted(0, -view.height(), 0, view.height())
+                                                     : view.adjusted(-view.width(), 0, view.width(), 0);
+    for (int row = 0; row < count(); ++row) {
+        QListWidgetItem* it = item(row);
+        if (itemWidget(it))
+            continue;
+        const QRect r = visualItemRect(it);
+        if (!r.isEmpty() && r.intersects(near))
+            makeRow(row);
+    }
+    m_makingRows = false;
+}
+
+void FlickList::showEvent(QShowEvent* event)
+{
+    QListWidget::showEvent(event);
+    makeRowsNearView();
+}
+
+void FlickList::scrollContentsBy(int dx, int dy)
+{
+    QListWidget::scrollContentsBy(dx, dy);
+    makeRowsNearView();
+}
+
+void FlickList::updateGeometries()
+{
+    QListWidget::updateGeometries();
+    makeRowsNearView();
+}
+
+QRect FlickList::rowGeometry(int row) const
+{
+    if (QWidget* widget = getWidget(row))
+        return widget->geometry();
+    return visualItemRect(item(row));
+}
+
 void FlickList::setScrollingDirection(Qt::Orientation direction)
 {
     m_orientation = direction;
@@ -208,12 +288,8 @@ void FlickList::updateShadows()
 {
     if (count() == 0 || !m_showShadow)
         return;
-    QWidget* first = getWidget(0);
-    QWidget* last = getWidget(count() - 1);
-    if (!first || !last)
-        return;
-    const QRect f = first->geometry();
-    const QRect l = last->geometry();
+    const QRect f = rowGeometry(0);
+    const QRect l = rowGeometry(count() - 1);
     // Each change rebuilds a pixmap: only when the ends have moved.
     if (f.top() == m_previousFirstWidgetTop && l.bottom() == m_previousLastWidgetBottom)
         return;

@@ -4,6 +4,8 @@
 #include <QListWidget>
 #include <QPixmap>
 
+#include <functional>
+
 class QLabel;
 class QsKineticScroller;
 
@@ -32,8 +34,18 @@ public:
     void prependWidget(QWidget* widget);
     // An index above the row count appends.
     void insertWidget(QWidget* widget, int index);
-    // Null at or past the count.
+    // Null at or past the count, and for a deferred row not yet made.
     QWidget* getWidget(int index) const;
+
+    // Rows whose widgets are made only when they come near the view, so that
+    // a list of hundreds is quick to build and light to keep. The factory
+    // gets the row number and returns the row's widget (the list owns it).
+    using RowFactory = std::function<QWidget*(int row)>;
+    void setRowFactory(RowFactory factory);
+    void addDeferredRow(const QSize& size);
+    // The row's widget, made now if it was deferred; null past the count.
+    QWidget* makeRow(int row);
+    int madeRowCount() const;
 
     void setScrollingDirection(Qt::Orientation direction);
     void setBackgroundStyleSheet(const QString& sheet);
@@ -55,10 +67,16 @@ public slots:
 protected:
     void paintEvent(QPaintEvent* event) override;
     void resizeEvent(QResizeEvent* event) override;
+    void showEvent(QShowEvent* event) override;
+    void scrollContentsBy(int dx, int dy) override;
+    void updateGeometries() override;
 
 private:
     QListWidgetItem* makeItem(QWidget* widget);
     void updateShadows();
+    // Where a row is, whether or not its widget exists yet.
+    QRect rowGeometry(int row) const;
+    void makeRowsNearView();
 
     Ui::FlickList* ui;
     QsKineticScroller* kineticScroller;
@@ -68,6 +86,8 @@ private:
     bool m_showShadow = true;
     qreal m_topOpacity = 0.0;
     qreal m_bottomOpacity = 0.0;
+    RowFactory m_rowFactory;
+    bool m_makingRows = false;
 };
 
 #endif // FLICKLIST_H

@@ -414,6 +414,57 @@ private slots:
         QCOMPARE(list.item(0)->sizeHint(), QSize(320, 62));
     }
 
+    void deferredRowsAreMadeAsTheyComeNearTheView()
+    {
+        QWidget window;
+        window.resize(320, 480);
+        FlickList list(&window);
+        list.setGeometry(0, 66, 320, 414);
+        QList<int> made;
+        list.setRowFactory([&made](int row) {
+            made << row;
+            auto* w = new QWidget;
+            w->setObjectName(QString::number(row));
+            return w;
+        });
+        for (int i = 0; i < 400; ++i)
+            list.addDeferredRow(QSize(320, 85));
+        list.setRowHidden(3, true);
+        window.show();
+        QVERIFY(QTest::qWaitForWindowExposed(&window));
+        QCoreApplication::processEvents();
+
+        // The view and a screen either side: a dozen rows, not four hundred,
+        // and never the hidden one.
+        QVERIFY2(made.size() >= 5 && made.size() <= 16, qPrintable(QString::number(made.size())));
+        QVERIFY(!made.contains(3));
+        QCOMPARE(list.madeRowCount(), made.size());
+        QCOMPARE(list.getWidget(0)->objectName(), QString("0"));
+        QCOMPARE(list.getWidget(399), static_cast<QWidget*>(nullptr));
+
+        // Scrolling makes the rows that arrive, once.
+        list.verticalScrollBar()->setValue(200 * 85);
+        QCoreApplication::processEvents();
+        QVERIFY(list.getWidget(200));
+        const int afterScroll = made.size();
+        list.verticalScrollBar()->setValue(200 * 85 + 10);
+        QCoreApplication::processEvents();
+        QCOMPARE(made.size(), afterScroll);
+        QCOMPARE(made.count(200), 1);
+
+        // Asked for by number, a far row is made at once; a hidden row too.
+        QCOMPARE(list.makeRow(399)->objectName(), QString("399"));
+        QCOMPARE(list.makeRow(3)->objectName(), QString("3"));
+        QCOMPARE(list.makeRow(400), static_cast<QWidget*>(nullptr));
+        QCOMPARE(list.makeRow(-1), static_cast<QWidget*>(nullptr));
+        // Unhiding brings a row in like any other.
+        list.setRowHidden(4, true);
+        list.verticalScrollBar()->setValue(0);
+        list.setRowHidden(4, false);
+        QCoreApplication::processEvents();
+        QVERIFY(list.getWidget(4));
+    }
+
     void shadowsShowWhatLiesBeyondTheEdges()
     {
         QWidget window;
