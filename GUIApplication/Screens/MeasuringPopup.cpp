@@ -2,6 +2,8 @@
 
 #include "ui_MeasuringPopup.h"
 
+#include "Widgets/KLabel.h"
+
 #include "GUIAPI/DataManager.h"
 #include "GUIAPI/API_SignalMaster.h"
 #include "SharedSystem/Platform.h"
@@ -71,6 +73,8 @@ void MeasuringPopup::Init()
         ui->setupUi(this);
         // The dimmer lies under the card, whatever the form's order.
         ui->labelBackGround->lower();
+        // Between the brackets: a long translation shrinks to fit.
+        ui->labelSubText->setAutoSize(true);
     }
     m_closeTimer.setSingleShot(true);
     m_timeToClose = 0;

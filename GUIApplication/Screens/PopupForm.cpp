@@ -87,7 +87,7 @@ void arrange(QWidget* icon, KLabel* title, KLabel* text)
 
     const QRect widest(0, 0, TextBox.width(), TextBox.height());
     const int textHeight = qMin(TextBox.height(),
-                                QFontMetrics(text->defaultFont())
+                                QFontMetrics(text->defaultFont(), text)
                                     .boundingRect(widest, Qt::TextWordWrap | Qt::AlignHCenter, text->defaultText())
                                     .height());
     const int block = (withIcon ? IconBox.height() + gap : 0) + TitleBox.height() + 4 + textHeight;

@@ -74,11 +74,15 @@ void KLabel::resizeEvent(QResizeEvent* event)
 QFont KLabel::fittedFont(const QString& text) const
 {
     QFont f = m_defaultFont;
+    // Measured for this label's screen: a point size becomes a different
+    // number of pixels there than on the default device, and whole pixels
+    // at that, so a size that fits on paper can still run over.
+    const auto metrics = [this](const QFont& font) { return QFontMetrics(font, this); };
     if (wordWrap()) {
         // Always the full text, also when a maximum length cuts what shows.
         const QRect box(0, 0, width(), height());
         while (sizeOf(f) > 1) {
-            const QRect needed = QFontMetrics(f).boundingRect(box, kWrapFlags, text);
+            const QRect needed = metrics(f).boundingRect(box, kWrapFlags, text);
             if (needed.width() <= width() && needed.height() <= height())
                 break;
             setSizeOf(f, sizeOf(f) - 1);
@@ -86,16 +90,27 @@ QFont KLabel::fittedFont(const QString& text) const
         return f;
     }
 
-    const QFontMetrics metrics(f);
-    const int textWidth = metrics.horizontalAdvance(text);
-    const int textHeight = metrics.height();
+    const QFontMetrics start = metrics(f);
+    const int textWidth = start.horizontalAdvance(text);
+    const int textHeight = start.height();
     const float widthRatio = textWidth > 0 ? float(width()) / float(textWidth) : 1.0f;
     const float heightRatio = textHeight > 0 ? float(height()) / float(textHeight) : 1.0f;
     const float ratio = std::min(widthRatio, heightRatio);
-    if (ratio < 1.0f) {
-        const qreal base = f.pointSize() > 0 ? f.pointSizeF() : qreal(f.pixelSize());
-        // A box of zero size must still leave a usable font.
-        setSizeOf(f, std::max<qreal>(1.0, base * ratio));
+    if (ratio >= 1.0f)
+        return f;
+    qreal size = f.pointSize() > 0 ? f.pointSizeF() : qreal(f.pixelSize());
+    // A box of zero size must still leave a usable font.
+    size = std::max<qreal>(1.0, size * ratio);
+    setSizeOf(f, size);
+    // The scaled size is rounded to whole pixels when drawn: step down
+    // until the text really fits.
+    const qreal step = f.pointSize() > 0 ? 0.25 : 1.0;
+    while (size > 1.0) {
+        const QFontMetrics m = metrics(f);
+        if (m.horizontalAdvance(text) <= width() && m.height() <= qMax(height(), 1))
+            break;
+        size = std::max<qreal>(1.0, size - step);
+        setSizeOf(f, size);
     }
     return f;
 }

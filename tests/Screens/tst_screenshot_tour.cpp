@@ -11,6 +11,7 @@
 #include "Screens/MeasuringPopup.h"
 #include "Screens/NotificationPopup.h"
 #include "Screens/OverridePopup.h"
+#include "Widgets/KLabel.h"
 #include "Screens/PowerDownPopup.h"
 #include "Screens/SadPuppyScreen.h"
 #include "Screens/SyncScreen.h"
@@ -22,6 +23,8 @@
 #include "Widgets/Theme.h"
 
 #include <QLabel>
+#include "Widgets/KLabel.h"
+
 #include <QtTest>
 
 #include "support/Tour.h"
@@ -55,10 +58,12 @@ void statusBarStates(QWidget* display)
     };
     int y = 16;
     for (const State& s : states) {
-        auto* caption = new QLabel(s.caption, display);
+        auto* caption = new KLabel(display);
         caption->setGeometry(12, y, 296, 22);
         caption->setFont(Theme::font(Theme::FontSmall + 1, true));
         caption->setStyleSheet(QString("color: %1;").arg(Theme::css(Theme::TextBody)));
+        caption->setAutoSize(true);
+        caption->setText(s.caption);
         SystemStatus status = Tour::workshopStatus();
         status.setBatteryState(s.battery);
         status.setBatteryChargePercent(s.percent);

@@ -96,9 +96,18 @@ private slots:
         const QString longText = "Measurement Cancelled by the operator";
         label.setText(longText);
         QVERIFY(label.font().pointSizeF() < 16.0);
-        // The fitted text really fits (rounding of point sizes may cost a pixel).
-        // One proportional step: hinting makes glyphs scale a little unevenly.
-        QVERIFY(QFontMetrics(label.font()).horizontalAdvance(longText) <= label.width() * 1.06);
+        // Fitted as the label draws: at its screen's resolution, in whole
+        // pixels, with no slack.
+        for (int width = 80; width <= 300; width += 7) {
+            label.resize(width, 40);
+            for (const QString& text : {longText, QString("Memoria dello strumento piena"),
+                                        QString("Alle abgeschlossenen Aufträge löschen?")}) {
+                label.setText(text);
+                const int drawn = QFontMetrics(label.font()).horizontalAdvance(text);
+                QVERIFY2(drawn <= width, qPrintable(QString("%1 px of %2 in %3").arg(drawn).arg(text).arg(width)));
+            }
+        }
+        label.resize(120, 40);
 
         label.setText("OK");
         QCOMPARE(label.font().pointSizeF(), 16.0);
