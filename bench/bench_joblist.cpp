@@ -181,6 +181,11 @@ int main(int argc, char** argv)
                        .arg(baseKiB / 1024.0, 0, 'f', 1);
         out.flush();
     }
+    // The list hands freed memory back once it has been quiet for a moment.
+    QElapsedTimer quiet;
+    quiet.start();
+    while (quiet.elapsed() < 2500)
+        QCoreApplication::processEvents(QEventLoop::AllEvents, 50);
     const long rss = residentKiB();
     sim.kill();
     sim.waitForFinished(3000);

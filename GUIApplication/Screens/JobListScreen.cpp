@@ -38,6 +38,7 @@ const int kRowBurst = 50;
 const int kCompleteRowOffset = 2;
 // The size of a row's form: the rows are laid out before they are made.
 const QSize kRowSize(320, 85);
+const int kReleaseMemoryDelayMs = 2000;
 // The walk for the row to keep in view after a delete starts here.
 const int kFirstWalkedRow = 5;
 // The instrument needs this long at most to settle after a measurement or a
@@ -108,6 +109,9 @@ JobListScreen::JobListScreen(QWidget* parent)
 
     m_initTimer.setSingleShot(true);
     m_initTimer.start(3000);
+    m_releaseMemoryTimer.setSingleShot(true);
+    m_releaseMemoryTimer.setInterval(kReleaseMemoryDelayMs);
+    connect(&m_releaseMemoryTimer, &QTimer::timeout, this, [] { Platform::releaseFreedMemory(); });
 
     stateChanged(true);
     stateChanged(false);
@@ -280,6 +284,11 @@ void JobListScreen::onUpdateScreen()
 
     if (many)
         onCloseSyncScreen();
+
+    // The previous table and its copies are gone now; handing their memory
+    // back takes a while, so it waits until the list has been quiet a moment.
+    if (n >= kManyJobs)
+        m_releaseMemoryTimer.start();
 
     if (!m_startupPlayed) {
         playSoundDeviceReady();

@@ -118,6 +118,7 @@ private:
     WebSyncButton* m_pWebSyncButton;
     int m_WebSyncButtonIndex;
     QTimer m_initTimer;
+    QTimer m_releaseMemoryTimer;
     bool m_calScreenShown;
 };
 

@@ -11,6 +11,10 @@
 
 #include <cstdlib>
 
+#ifdef __GLIBC__
+#include <malloc.h>
+#endif
+
 namespace {
 
 QMutex& platformMutex()
@@ -70,6 +74,13 @@ QString devicePath(const QString& absolutePath)
     if (absolutePath.startsWith('/'))
         return base + absolutePath;
     return base + '/' + absolutePath;
+}
+
+void releaseFreedMemory()
+{
+#ifdef __GLIBC__
+    malloc_trim(0);
+#endif
 }
 
 bool isDeviceBuild()

@@ -43,6 +43,12 @@ public:
 // stop, "stop <program> <arguments>".
 std::unique_ptr<Process> startProcess(const QString& program, const QStringList& arguments);
 
+// Gives memory that was freed back to the system. The C library keeps freed
+// blocks in its per-thread pools, so a job table of hundreds of jobs, read
+// again and again on the data thread and copied on the GUI thread, would
+// otherwise leave the process as large as its largest moment.
+void releaseFreedMemory();
+
 // What a host build would have run, oldest first ("aplay -N /opt/...").
 QStringList recordedCommands();
 void clearRecordedCommands();
