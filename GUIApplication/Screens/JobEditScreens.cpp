@@ -23,7 +23,7 @@ const char* const kQuickSelectStyle =
     "QPushButton:pressed { border-image: none; background-color: rgb(214, 241, 252); border-radius: 18px; }";
 
 const char* const kMoreStyle =
-    "QPushButton { border: none; border-radius: 18px; color: rgb(0, 174, 239);"
+    "QPushButton { border: 2px solid rgb(0, 174, 239); border-radius: 18px; color: rgb(0, 174, 239);"
     " background-color: rgb(255, 255, 255); margin: 2px 0px 2px 0px; }"
     "QPushButton[selected=\"true\"] { color: rgb(255, 255, 255); background-color: rgb(0, 174, 239); }"
     "QPushButton:disabled { color: rgb(190, 190, 190); }";
@@ -46,10 +46,9 @@ WordWrapButton* makeQuickSelect(QWidget* parent, const QString& name, int x, int
     button->setStyleSheet(kQuickSelectStyle);
     button->setGeometry(x, y, kQuickWidth, kQuickHeight);
     QFont font = button->font();
-    font.setPointSize(13);
+    font.setPointSize(12);
     button->setFont(font);
     button->setFontColor(0, 174, 239);
-    button->label()->setStyleSheet("color: rgb(0, 174, 239); background: transparent; padding: 0px 10px;");
     button->setTextAutoSize(true);
     return button;
 }
