@@ -51,7 +51,86 @@ bool isComposedLanguage(const QString& code)
 int rightEdge(const QRect& r) { return r.left() + r.width() - 1; }
 int bottomEdge(const QRect& r) { return r.top() + r.height() - 1; }
 
-XPushButton* makeFunctionKey(QWidget* parent, const QString& name)
+} // namespace
+
+// ---------------------------------------------------------------- KeypadLayout
+
+namespace KeypadLayout {
+
+int layerOf(bool caps, bool special)
+{
+    if (caps)
+        return special ? JobKeypadScreen::LayerSpecialCapital : JobKeypadScreen::LayerCapital;
+    return special ? JobKeypadScreen::LayerSpecialLower : JobKeypadScreen::LayerLower;
+}
+
+int createKeyLabels(QWidget* parent, const KeypadArray& array, KeyLayers& layers)
+{
+    QFont font = parent->font();
+    font.setPointSize(20);
+    QPalette palette = parent->palette();
+    for (QPalette::ColorGroup group : {QPalette::Active, QPalette::Inactive}) {
+        palette.setColor(group, QPalette::WindowText, kKeyText);
+        palette.setColor(group, QPalette::Text, kKeyText);
+    }
+    palette.setColor(QPalette::Disabled, QPalette::WindowText, kKeyTextDisabled);
+    palette.setColor(QPalette::Disabled, QPalette::Text, kKeyTextDisabled);
+
+    layers = KeyLayers(JobKeypadScreen::NumLayers);
+    int rowY = 0;
+    auto addLabel = [&](const KEYPAD_BUTTON_T& key, QChar character, int layer) {
+        auto* label = new KeyPadLabel(parent);
+        label->m_Key = key;
+        label->setText(QString(character));
+        label->setGeometry(key.geometry);
+        label->setFont(font);
+        label->setPalette(palette);
+        label->setStyleSheet(kKeyStyle);
+        label->setAlignment(Qt::AlignHCenter | Qt::AlignVCenter);
+        label->raise();
+        layers[layer].append(label);
+        rowY = std::max(rowY, bottomEdge(key.geometry));
+    };
+    for (const KEYPAD_BUTTON_T& key : array) {
+        if (!key.characterCap.isNull())
+            addLabel(key, key.characterCap,
+                     key.special ? JobKeypadScreen::LayerSpecialCapital : JobKeypadScreen::LayerCapital);
+        if (!key.characterLow.isNull())
+            addLabel(key, key.characterLow,
+                     key.special ? JobKeypadScreen::LayerSpecialLower : JobKeypadScreen::LayerLower);
+    }
+    return rowY;
+}
+
+bool hasSpecialPage(const KeyLayers& layers)
+{
+    return layers.size() == JobKeypadScreen::NumLayers
+           && (!layers[JobKeypadScreen::LayerSpecialCapital].isEmpty()
+               || !layers[JobKeypadScreen::LayerSpecialLower].isEmpty());
+}
+
+void showLayer(const KeyLayers& layers, int shown)
+{
+    for (int layer = 0; layer < layers.size(); ++layer) {
+        for (KeyPadLabel* label : layers[layer]) {
+            label->setVisible(layer == shown);
+            label->setEnabled(layer == shown);
+        }
+    }
+}
+
+KeyPadLabel* keyAt(const KeyLayers& layers, int layer, const QPoint& pos)
+{
+    if (layer < 0 || layer >= layers.size())
+        return nullptr;
+    for (KeyPadLabel* label : layers[layer]) {
+        if (label->isEnabled() && label->geometry().contains(pos))
+            return label;
+    }
+    return nullptr;
+}
+
+XPushButton* createFunctionKey(QWidget* parent, const QString& name)
 {
     auto* button = new XPushButton(parent);
     button->setObjectName(name);
@@ -66,7 +145,33 @@ XPushButton* makeFunctionKey(QWidget* parent, const QString& name)
     return button;
 }
 
-} // namespace
+void fitText(QPushButton* button, const QString& text)
+{
+    button->setText(text);
+    QFont font = button->font();
+    font.setPointSize(20);
+    const QFontMetricsF metrics(font);
+    const qreal textWidth = metrics.horizontalAdvance(text);
+    const qreal textHeight = metrics.height();
+    // The key's cap is inset by its margins.
+    const qreal width = button->width() - 8;
+    const qreal height = button->height() - 6;
+    const qreal ratio = std::min(textWidth > 0 ? width / textWidth : 1.0,
+                                 textHeight > 0 ? height / textHeight : 1.0);
+    if (ratio < 1.0)
+        font.setPointSizeF(std::max<qreal>(1.0, font.pointSizeF() * ratio));
+    button->setFont(font);
+}
+
+QPoint notificationPlace(const QWidget* key, const QSize& popup)
+{
+    const QRect g = key->geometry();
+    const int centreX = g.left() + g.width() / 2;
+    const int centreY = g.top() + g.height() / 2;
+    return QPoint(centreX - popup.width() / 2, centreY + 44 - popup.height());
+}
+
+} // namespace KeypadLayout
 
 // ---------------------------------------------------------------- KeyPadLabel
 
@@ -140,6 +245,7 @@ JobKeypadScreen::JobKeypadScreen(QWidget* parent)
 
 JobKeypadScreen::~JobKeypadScreen()
 {
+    m_composer.reset();
     delete ui;
 }
 
@@ -181,9 +287,7 @@ QString JobKeypadScreen::title() const
 
 int JobKeypadScreen::currentLayer() const
 {
-    if (m_displayCap)
-        return m_displaySpecial ? LayerSpecialCapital : LayerCapital;
-    return m_displaySpecial ? LayerSpecialLower : LayerLower;
+    return KeypadLayout::layerOf(m_displayCap, m_displaySpecial);
 }
 
 void JobKeypadScreen::setTitle(const QString& title)
@@ -219,6 +323,8 @@ void JobKeypadScreen::onKeyClicked(const QString& text)
 
 void JobKeypadScreen::onDeleteClicked()
 {
+    if (m_multilingual && m_composer && m_composer->deletePressed())
+        return;
     QTextCursor cursor = ui->textEdit->textCursor();
     if (cursor.hasSelection())
         cursor.removeSelectedText();
@@ -235,7 +341,30 @@ void JobKeypadScreen::onSpaceClicked()
 
 void JobKeypadScreen::onEnterClicked()
 {
-    // Enter only takes a composition; the composing input overrides this.
+    // Enter only takes a composition.
+    if (m_multilingual && m_composer)
+        m_composer->enterPressed();
+}
+
+JobKeypadScreen::ComposerFactory& JobKeypadScreen::composerFactory()
+{
+    static ComposerFactory factory;
+    return factory;
+}
+
+void JobKeypadScreen::setComposerFactory(ComposerFactory factory)
+{
+    composerFactory() = std::move(factory);
+}
+
+QLabel* JobKeypadScreen::multilingualBufferLabel() const
+{
+    return ui->multilingualBufferLabel;
+}
+
+QLabel* JobKeypadScreen::labelCover() const
+{
+    return ui->labelCover;
 }
 
 void JobKeypadScreen::onShiftClicked()
@@ -281,10 +410,7 @@ void JobKeypadScreen::onKeyPressed(QWidget* key)
     }
     m_keyPopup = createKeyPressedNotification(label->text());
     if (m_keyPopup) {
-        const QRect g = label->geometry();
-        const int centreX = g.left() + g.width() / 2;
-        const int centreY = g.top() + g.height() / 2;
-        m_keyPopup->move(centreX - m_keyPopup->width() / 2, centreY + 44 - m_keyPopup->height());
+        m_keyPopup->move(KeypadLayout::notificationPlace(label, m_keyPopup->size()));
         m_keyPopup->raise();
         m_keyPopup->show();
     }
@@ -356,49 +482,17 @@ void JobKeypadScreen::createPopup()
 
 void JobKeypadScreen::createKeypad()
 {
-    const KeypadArray array = DataManager::instance()->getKeypadArray();
-
-    QFont font = this->font();
-    font.setPointSize(20);
-    QPalette palette = this->palette();
-    for (QPalette::ColorGroup group : {QPalette::Active, QPalette::Inactive}) {
-        palette.setColor(group, QPalette::WindowText, kKeyText);
-        palette.setColor(group, QPalette::Text, kKeyText);
-    }
-    palette.setColor(QPalette::Disabled, QPalette::WindowText, kKeyTextDisabled);
-    palette.setColor(QPalette::Disabled, QPalette::Text, kKeyTextDisabled);
-
-    m_keys = QVector<QVector<KeyPadLabel*>>(NumLayers);
-    int rowY = 0;
-    auto addLabel = [&](const KEYPAD_BUTTON_T& key, QChar character, int layer) {
-        auto* label = new KeyPadLabel(this);
-        label->m_Key = key;
-        label->setText(QString(character));
-        label->setGeometry(key.geometry);
-        label->setFont(font);
-        label->setPalette(palette);
-        label->setStyleSheet(kKeyStyle);
-        label->setAlignment(Qt::AlignHCenter | Qt::AlignVCenter);
-        label->raise();
-        m_keys[layer].append(label);
-        rowY = std::max(rowY, bottomEdge(key.geometry));
-    };
-    for (const KEYPAD_BUTTON_T& key : array) {
-        if (!key.characterCap.isNull())
-            addLabel(key, key.characterCap, key.special ? LayerSpecialCapital : LayerCapital);
-        if (!key.characterLow.isNull())
-            addLabel(key, key.characterLow, key.special ? LayerSpecialLower : LayerLower);
-    }
+    const int rowY = KeypadLayout::createKeyLabels(this, DataManager::instance()->getKeypadArray(), m_keys);
     m_functionRowY = rowY;
 
-    const bool hasSpecial = !m_keys[LayerSpecialCapital].isEmpty() || !m_keys[LayerSpecialLower].isEmpty();
+    const bool hasSpecial = KeypadLayout::hasSpecialPage(m_keys);
 
-    BtnSpace = makeFunctionKey(this, "BtnSpace");
+    BtnSpace = KeypadLayout::createFunctionKey(this, "BtnSpace");
     BtnSpace->setGeometry(hasSpecial ? 134 : 108, rowY, 104, 55);
     BtnSpace->setIcon(QIcon(":/Assets/keyboard_space_key.png"));
     BtnSpace->setIconSize(QSize(88, 44));
 
-    BtnDelete = makeFunctionKey(this, "BtnDelete");
+    BtnDelete = KeypadLayout::createFunctionKey(this, "BtnDelete");
     BtnDelete->setGeometry(rightEdge(BtnSpace->geometry()), rowY, 52, 55);
     BtnDelete->setIcon(QIcon(":/Assets/keyboard_back_key.png"));
     BtnDelete->setIconSize(QSize(44, 44));
@@ -407,18 +501,18 @@ void JobKeypadScreen::createKeypad()
     BtnDelete->setAutoRepeatDelay(500);
     BtnDelete->setAutoRepeatInterval(90);
 
-    BtnEnter = makeFunctionKey(this, "BtnEnter");
+    BtnEnter = KeypadLayout::createFunctionKey(this, "BtnEnter");
     BtnEnter->setGeometry(rightEdge(BtnDelete->geometry()), rowY, 52, 55);
     BtnEnter->setIcon(QIcon(":/Assets/keyboard_enter_key.png"));
     BtnEnter->setIconSize(QSize(52, 44));
     BtnEnter->setDebounceEnabled(true);
 
-    BtnShift = makeFunctionKey(this, "BtnShift");
+    BtnShift = KeypadLayout::createFunctionKey(this, "BtnShift");
     BtnShift->setGeometry(BtnSpace->x() - 52, rowY, 52, 55);
     BtnShift->setIcon(QIcon(":/Assets/keyboard_shift_key.png"));
     BtnShift->setIconSize(QSize(44, 44));
 
-    BtnSpecial = makeFunctionKey(this, "BtnSpecial");
+    BtnSpecial = KeypadLayout::createFunctionKey(this, "BtnSpecial");
     BtnSpecial->setGeometry(0, rowY, BtnShift->x(), 55);
     BtnSpecial->setVisible(hasSpecial);
     BtnSpecial->setEnabled(hasSpecial);
@@ -429,6 +523,8 @@ void JobKeypadScreen::createKeypad()
     BtnEnter->setEnabled(m_multilingual);
     if (m_multilingual) {
         initComposer(code);
+        if (composerFactory())
+            m_composer.reset(composerFactory()(this, code));
         BtnShift->hide();
         BtnShift->setEnabled(false);
         for (XPushButton* button : {BtnShift, BtnSpace, BtnDelete, BtnEnter})
@@ -453,13 +549,7 @@ void JobKeypadScreen::initComposer(const QString&)
 
 void JobKeypadScreen::updateKeypad()
 {
-    const int shown = currentLayer();
-    for (int layer = 0; layer < m_keys.size(); ++layer) {
-        for (KeyPadLabel* label : qAsConst(m_keys[layer])) {
-            label->setVisible(layer == shown);
-            label->setEnabled(layer == shown);
-        }
-    }
+    KeypadLayout::showLayer(m_keys, currentLayer());
     // Shift shows its latch by the accent ground.
     if (BtnShift) {
         BtnShift->setProperty("selected", m_displayCap);
@@ -474,22 +564,8 @@ void JobKeypadScreen::updateSpecialText()
 {
     if (!BtnSpecial)
         return;
-    const QString text = m_displaySpecial ? tr("ABC") : tr("Special Keys");
-    BtnSpecial->setText(text);
     // A translation longer than the key shrinks to fit it.
-    QFont font = BtnSpecial->font();
-    font.setPointSize(20);
-    const QFontMetricsF metrics(font);
-    const qreal textWidth = metrics.horizontalAdvance(text);
-    const qreal textHeight = metrics.height();
-    // The key's cap is inset by its margins.
-    const qreal width = BtnSpecial->width() - 8;
-    const qreal height = BtnSpecial->height() - 6;
-    const qreal ratio = std::min(textWidth > 0 ? width / textWidth : 1.0,
-                                 textHeight > 0 ? height / textHeight : 1.0);
-    if (ratio < 1.0)
-        font.setPointSizeF(std::max<qreal>(1.0, font.pointSizeF() * ratio));
-    BtnSpecial->setFont(font);
+    KeypadLayout::fitText(BtnSpecial, m_displaySpecial ? tr("ABC") : tr("Special Keys"));
 }
 
 QWidget* JobKeypadScreen::createKeyPressedNotification(QString text)
@@ -499,7 +575,7 @@ QWidget* JobKeypadScreen::createKeyPressedNotification(QString text)
 
 void JobKeypadScreen::PushEventKey(const QString& text)
 {
-    if (m_multilingual && onShowMultilingualPopup(text))
+    if (m_multilingual && (onShowMultilingualPopup(text) || (m_composer && m_composer->keyPressed(text))))
         return;
     QTextCursor cursor = ui->textEdit->textCursor();
     cursor.insertText(text);
@@ -517,19 +593,14 @@ void JobKeypadScreen::onUpdateScreen()
 
 KeyPadLabel* JobKeypadScreen::keyAt(const QPoint& pos) const
 {
-    const int layer = currentLayer();
-    if (layer >= m_keys.size())
-        return nullptr;
-    for (KeyPadLabel* label : m_keys[layer]) {
-        if (label->isEnabled() && label->geometry().contains(pos))
-            return label;
-    }
-    return nullptr;
+    return KeypadLayout::keyAt(m_keys, currentLayer(), pos);
 }
 
 void JobKeypadScreen::mousePressEvent(QMouseEvent* event)
 {
     DaddyPanel::mousePressEvent(event);
+    // The panel follows the finger from here to the release.
+    event->accept();
     if (KeyPadLabel* label = keyAt(event->pos()))
         onKeyPressed(label);
 }
@@ -537,6 +608,7 @@ void JobKeypadScreen::mousePressEvent(QMouseEvent* event)
 void JobKeypadScreen::mouseMoveEvent(QMouseEvent* event)
 {
     DaddyPanel::mouseMoveEvent(event);
+    event->accept();
     if (KeyPadLabel* label = keyAt(event->pos()))
         onKeyPressed(label);
     else
@@ -546,6 +618,7 @@ void JobKeypadScreen::mouseMoveEvent(QMouseEvent* event)
 void JobKeypadScreen::mouseReleaseEvent(QMouseEvent* event)
 {
     DaddyPanel::mouseReleaseEvent(event);
+    event->accept();
     if (m_currentKey)
         onKeyClicked(m_currentKey->text());
     onKeyReleased();

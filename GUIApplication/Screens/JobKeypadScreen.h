@@ -8,6 +8,9 @@
 #include <QString>
 #include <QVector>
 
+#include <functional>
+#include <memory>
+
 namespace Ui {
 class JobKeypadScreen;
 }
@@ -41,6 +44,53 @@ public:
 private:
     QLabel* labelBackground;
     QLabel* labelText;
+};
+
+class KeyPadLabel;
+class JobKeypadScreen;
+
+// The keys of a layout as labels, for every panel that types on a layout
+// file (the job's text screens, the Wi-Fi password): build the layers, show
+// one, and find the key under the finger. The panel follows the finger in
+// its own mouse handlers:
+//
+//     KeypadArray array;
+//     DataManager::instance()->loadKeypad("wifi", array);
+//     const int rowY = KeypadLayout::createKeyLabels(this, array, m_keys);
+//     KeypadLayout::showLayer(m_keys, KeypadLayout::layerOf(caps, special));
+//     ... press/move: KeypadLayout::keyAt(m_keys, layer, event->pos())
+typedef QVector<QVector<KeyPadLabel*>> KeyLayers;
+namespace KeypadLayout {
+// The layer of m_keys shown for the two flags.
+int layerOf(bool caps, bool special);
+// Labels for every key of `array` on `parent`, in file order into the four
+// layers; returns the y of the function row (the largest bottom edge, 0
+// without keys).
+int createKeyLabels(QWidget* parent, const KeypadArray& array, KeyLayers& layers);
+// Whether the layout has a special page (and so a BtnSpecial).
+bool hasSpecialPage(const KeyLayers& layers);
+// Shows and enables the labels of one layer, hides and disables the others.
+void showLayer(const KeyLayers& layers, int layer);
+// The first enabled label of the layer whose box holds `pos`, or null.
+KeyPadLabel* keyAt(const KeyLayers& layers, int layer, const QPoint& pos);
+// A function key (space, delete, shift, special, enter) in the keypad's look.
+XPushButton* createFunctionKey(QWidget* parent, const QString& name);
+// Sets the text, shrinking the font so that it fits the key.
+void fitText(QPushButton* button, const QString& text);
+// Where the enlarged key of that size stands over `key`.
+QPoint notificationPlace(const QWidget* key, const QSize& popup);
+} // namespace KeypadLayout
+
+// Composes the text of languages typed in parts (Korean, Chinese) on a
+// keypad in multilingual mode. The keypad offers it each key, Delete and
+// Enter first; what it doesn't take, the keypad handles as usual.
+class KeypadComposer
+{
+public:
+    virtual ~KeypadComposer() = default;
+    virtual bool keyPressed(const QString& text) = 0;
+    virtual bool deletePressed() = 0;
+    virtual void enterPressed() = 0;
 };
 
 // The text entry screen of a job: a title bar with back and next, one text
@@ -97,6 +147,14 @@ public:
     QString title() const;
     // The y of the function row: the largest bottom edge of the keys.
     int functionRowY() const { return m_functionRowY; }
+    QLabel* multilingualBufferLabel() const;
+    QLabel* labelCover() const;
+
+    // Multilingual keypads get their composer from here, one per screen,
+    // made once the keys stand; the screen owns it.
+    typedef std::function<KeypadComposer*(JobKeypadScreen* screen, const QString& code)> ComposerFactory;
+    static void setComposerFactory(ComposerFactory factory);
+    KeypadComposer* composer() const { return m_composer.get(); }
 
 public slots:
     virtual void setTitle(const QString& title);
@@ -161,8 +219,11 @@ protected:
     bool m_changeColor = false;
 
 private:
+    static ComposerFactory& composerFactory();
     void retranslate();
     void updateSpecialText();
+
+    std::unique_ptr<KeypadComposer> m_composer;
 
     bool m_multilingual = false;
     int m_functionRowY = 0;

@@ -91,6 +91,7 @@ private slots:
     void slideOffEntersNothing();
     void overlappingKeysFirstWins();
     void readSwitchNeverEntersTheField();
+    void composedLanguageHandsKeysToTheComposer();
 
     // Name, free tag, notes
     void fullNameGreysTheKeys();
@@ -500,6 +501,68 @@ void tst_Keypad::readSwitchNeverEntersTheField()
     const QString before = screen->text();
     QTest::keyClick(screen->getTextEditPointer(), Qt::Key_Return);
     QCOMPARE(screen->text(), before);
+}
+
+namespace {
+// Takes every other key and records what it saw.
+class RecordingComposer : public KeypadComposer
+{
+public:
+    explicit RecordingComposer(QStringList* seen)
+        : m_seen(seen)
+    {
+    }
+    bool keyPressed(const QString& text) override
+    {
+        *m_seen << text;
+        return m_seen->size() % 2 == 1;
+    }
+    bool deletePressed() override
+    {
+        *m_seen << "<del>";
+        return true;
+    }
+    void enterPressed() override { *m_seen << "<enter>"; }
+
+private:
+    QStringList* m_seen;
+};
+} // namespace
+
+void tst_Keypad::composedLanguageHandsKeysToTheComposer()
+{
+    QStringList seen;
+    QString code;
+    JobKeypadScreen::setComposerFactory([&](JobKeypadScreen*, const QString& language) -> KeypadComposer* {
+        code = language;
+        return new RecordingComposer(&seen);
+    });
+    DataManager::instance()->setLanguageCode("ko");
+    freshJob();
+    auto* screen = open<JobNameEditScreen>(JOB_NAME_SCREEN_ID);
+    restoreLayout();
+    JobKeypadScreen::setComposerFactory(nullptr);
+    QVERIFY(screen);
+    QCOMPARE(code, QString("ko"));
+    QVERIFY(screen->isMultilingual());
+    // Enter comes in, shift goes, and the row moves a half key left.
+    QVERIFY(screen->btnEnter()->isVisible());
+    QVERIFY(!screen->btnShift()->isVisible());
+    QCOMPARE(screen->btnSpace()->x(), 108 - 26);
+    QCOMPARE(screen->btnEnter()->x(), 108 + 103 + 51 - 26);
+
+    screen->getTextEditPointer()->clear();
+    const QPoint g = centreOf(labelFor(screen, "G"));
+    for (int i = 0; i < 2; ++i) {
+        sendMouse(screen, QEvent::MouseButtonPress, g);
+        sendMouse(screen, QEvent::MouseButtonRelease, g);
+    }
+    // The first was taken by the composer, the second left to the keypad.
+    QCOMPARE(screen->text(), QString("G"));
+    QTest::mouseClick(screen->btnDelete(), Qt::LeftButton);
+    QTest::mouseClick(screen->btnEnter(), Qt::LeftButton);
+    QCOMPARE(seen, (QStringList{"G", "G", "<del>", "<enter>"}));
+    QCOMPARE(screen->text(), QString("G"));
 }
 
 // ---------------------------------------------------------------- name, free tag, notes
