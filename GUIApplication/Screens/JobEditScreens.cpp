@@ -61,6 +61,13 @@ void cursorToEnd(QPlainTextEdit* field)
     field->setTextCursor(cursor);
 }
 
+// The job as the server now holds it, at once: the next screen must not edit
+// from the copy the change left behind, and the summary shows it.
+void rereadJob()
+{
+    DataManager::instance()->updateCurrentJobInfo();
+}
+
 NotificationPopup* makeNotification(DaddyPanel* panel, const QString& header, const QString& message)
 {
     auto* popup = new NotificationPopup(panel->parentWidget() ? panel->parentWidget() : panel);
@@ -117,8 +124,10 @@ void JobNameEditScreen::onNextAction()
         return;
     }
     // Keeping the own name is allowed and sends nothing.
-    if (name != own)
+    if (name != own) {
         data->editCurrentJobDisplayName(name);
+        rereadJob();
+    }
     CloseScreen();
 }
 
@@ -161,6 +170,7 @@ void JobTagFreeEditScreen::onNextAction()
     Job job = data->getActiveJobObject();
     job.setTagData(m_tagState, tag);
     data->editJob(data->getActiveJob(), job);
+    rereadJob();
     CloseScreen();
 }
 
@@ -190,6 +200,7 @@ void JobFreeTextEditScreen::onNextAction()
     Job job = data->getActiveJobObject();
     job.setNotes(text());
     data->editJob(data->getActiveJob(), job);
+    rereadJob();
     CloseScreen();
 }
 
@@ -501,6 +512,7 @@ void JobTagEditScreen::onNextAction()
     }
 
     data->editJob(data->getActiveJob(), job);
+    rereadJob();
     CloseScreen();
 }
 

@@ -105,6 +105,9 @@ private slots:
     void unknownTagIsRefused();
     void tagCascade();
 
+    // The road of a new job
+    void newJobIsNamedAndTaggedOnTheKeypad();
+
 private:
     // A fresh open job, the active one; its tags and notes as given.
     void freshJob(const QStringList& tags = {}, const QString& name = QString());
@@ -823,6 +826,75 @@ void tst_Keypad::tagCascade()
     freshJob({"Ford", "Focus", "Z1 Frozen White"});
     setTag(JOB_TAGS_1_SCREEN_ID, " ");
     QCOMPARE(tags(), (QStringList{"", "", ""}));
+}
+
+// ---------------------------------------------------------------- a new job
+
+void tst_Keypad::newJobIsNamedAndTaggedOnTheKeypad()
+{
+    JobListScreen* home = m_master->findChild<JobListScreen*>();
+    QVERIFY(home);
+    QTRY_VERIFY(home->isActive() && home->isEnabled() && home->isReady());
+    const int before = int(DataManager::instance()->getNumberOfJobs());
+    QTest::mouseClick(home->findChild<QPushButton*>("BtnAddJob"), Qt::LeftButton);
+    // The new job goes to targeting (a stand-in here); the job's summary
+    // opens the text screens from there.
+    QTRY_VERIFY_WITH_TIMEOUT(m_master->screenCount() == 2, 10000);
+    auto* next = qobject_cast<DaddyPanel*>(m_master->currentScreen());
+    QVERIFY(next && !qobject_cast<JobKeypadScreen*>(next));
+    QCOMPARE(int(DataManager::instance()->getNumberOfJobs()), before + 1);
+
+    auto tap = [](JobKeypadScreen* screen, const QString& keys) {
+        for (const QChar c : keys) {
+            if (c == ' ') {
+                QTest::mouseClick(screen->btnSpace(), Qt::LeftButton);
+                continue;
+            }
+            KeyPadLabel* key = labelFor(screen, QString(c));
+            QVERIFY2(key && key->isEnabled(), qPrintable(QString(c)));
+            sendMouse(screen, QEvent::MouseButtonPress, centreOf(key));
+            sendMouse(screen, QEvent::MouseButtonRelease, centreOf(key));
+        }
+    };
+    auto openFrom = [this](DaddyPanel* from, SCREEN_ID_T id) {
+        from->GotoScreen(id);
+        return qobject_cast<JobKeypadScreen*>(m_master->currentScreen());
+    };
+
+    JobKeypadScreen* name = openFrom(next, JOB_NAME_SCREEN_ID);
+    QVERIFY(name);
+    tap(name, "WING RF");
+    QTest::mouseClick(name->btnNext(), Qt::LeftButton);
+    QTRY_COMPARE(m_master->currentScreen(), static_cast<QWidget*>(next));
+
+    auto* make = qobject_cast<JobTagEditScreen*>(openFrom(next, JOB_TAGS_1_SCREEN_ID));
+    QVERIFY(make);
+    tap(make, "TO");
+    QCOMPARE(make->btnLeft()->text(), QString("Toyota"));
+    QTest::mouseClick(make->btnLeft(), Qt::LeftButton);
+    QTest::mouseClick(make->btnNext(), Qt::LeftButton);
+    QTRY_COMPARE(m_master->currentScreen(), static_cast<QWidget*>(next));
+
+    auto* model = qobject_cast<JobTagEditScreen*>(openFrom(next, JOB_TAGS_2_SCREEN_ID));
+    QVERIFY(model);
+    tap(model, "C");
+    QTest::mouseClick(model->btnLeft(), Qt::LeftButton);
+    const QString modelName = model->text();
+    QVERIFY(!modelName.isEmpty());
+    QTest::mouseClick(model->btnNext(), Qt::LeftButton);
+    QTRY_COMPARE(m_master->currentScreen(), static_cast<QWidget*>(next));
+
+    auto* notes = openFrom(next, JOB_FREE_TEXT_SCREEN_ID);
+    QVERIFY(notes);
+    tap(notes, "CLEAR COAT");
+    QTest::mouseClick(notes->btnNext(), Qt::LeftButton);
+    QTRY_COMPARE(m_master->currentScreen(), static_cast<QWidget*>(next));
+
+    const Job job = serverJob();
+    QCOMPARE(job.getDisplayName(), QString("WING RF"));
+    QCOMPARE(job.getTagData(TAG_STATE_1).defaultName(), QString("Toyota"));
+    QCOMPARE(job.getTagData(TAG_STATE_2).defaultName(), modelName);
+    QCOMPARE(job.getNotes(), QString("CLEAR COAT"));
 }
 
 QTEST_MAIN(tst_Keypad)
