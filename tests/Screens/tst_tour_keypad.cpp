@@ -163,6 +163,13 @@ QList<Tour::Stop> stops()
              popup->raise();
              popup->show();
          }},
+        // Korean composes its text: Enter comes in and shift goes.
+        {"keypad_multilingual_ko", [](QWidget* d) {
+             loadData();
+             DataManager::instance()->setLanguageCode("ko");
+             new JobNameEditScreen(d);
+             DataManager::instance()->setLanguageCode("en");
+         }, "ko"},
         {"keypad_fixed_letters", [](QWidget* d) {
              Tour::titleBar(d, "Keypad", 0);
              auto* pad = new Keypad(d);

@@ -6,7 +6,7 @@ Each layout keeps the rows of the language's own keyboard on the normal page
 punctuation on the special page. Keys are 26 x 55, rows centred on the
 320-pixel screen; the rows end at 389, where the function row starts.
 
-Run from the repository root: tools/make_keypad_layouts.py
+Run from anywhere: tools/keypads/make_keypad_layouts.py
 """
 import os
 from xml.sax.saxutils import quoteattr
@@ -78,6 +78,6 @@ def write(code, layout, folder):
 
 
 if __name__ == "__main__":
-    folder = os.path.join(os.path.dirname(__file__), "..", "opt", "GUI", "Keypad")
+    folder = os.path.join(os.path.dirname(os.path.abspath(__file__)), "..", "..", "opt", "GUI", "Keypad")
     for code, layout in LAYOUTS.items():
         write(code, layout, folder)
