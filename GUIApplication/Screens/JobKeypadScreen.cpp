@@ -81,9 +81,11 @@ int createKeyLabels(QWidget* parent, const KeypadArray& array, KeyLayers& layers
     auto addLabel = [&](const KEYPAD_BUTTON_T& key, QChar character, int layer) {
         auto* label = new KeyPadLabel(parent);
         label->m_Key = key;
-        label->setText(QString(character));
         label->setGeometry(key.geometry);
+        // A glyph wider than its key (a CJK font's full-width sign) shrinks.
+        label->setAutoSize(true);
         label->setFont(font);
+        label->setText(QString(character));
         label->setPalette(palette);
         label->setStyleSheet(kKeyStyle);
         label->setAlignment(Qt::AlignHCenter | Qt::AlignVCenter);
