@@ -4,6 +4,7 @@
 #include "GUIAPI/DataManager.h"
 #include "Screens/DaddyPanel.h"
 #include "Screens/JobListScreen.h"
+#include "Screens/JobMeasureScreen.h"
 #include "Screens/LockScreen.h"
 #include "Screens/SadPuppyScreen.h"
 #include "Screens/SyncScreen.h"
@@ -141,6 +142,7 @@ QWidget* ScreenMaster::createScreen(SCREEN_ID_T id)
     // Screens of later parts join this list as they are built.
     switch (id) {
     case JOB_LIST_SCREEN_ID: return new JobListScreen(this);
+    case JOB_MEASURE_SCREEN_ID: return new JobMeasureScreen(this);
     case SYNC_SCREEN_ID: return new SyncScreen(this);
     case LOCK_SCREEN_ID: return new LockScreen(this);
     case SAD_PUPPY_POPUP_SCREEN_ID: return new SadPuppyScreen(this);
