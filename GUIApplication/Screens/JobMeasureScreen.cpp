@@ -300,6 +300,9 @@ void JobMeasureScreen::keyPressEvent(QKeyEvent* event)
 
 void JobMeasureScreen::onReadSwitchPressed()
 {
+    // A question on screen (delete, edit) is answered first.
+    if (!popups().empty())
+        return;
     DataManager* data = DataManager::instance();
     const Job job = data->getActiveJobObject();
     if (job.isJobValid() && data->getSystemStatus().getSystemState() == STATE_INIT && !job.isJobComplete())

@@ -479,9 +479,15 @@ void tst_JobMeasure::readSwitchMeasuresOnlyWhenIdleAndOpen()
     QTest::qWait(100);
     QVERIFY(requestedScreens().isEmpty());
 
-    // Open and idle: on to targeting, in place of the summary.
+    // Open and idle: on to targeting, in place of the summary, but not while
+    // the screen asks a question.
     QVERIFY(control(QStringLiteral("busy off")).startsWith(QLatin1String("OK")));
     waitForState(STATE_INIT);
+    screen->on_BtnBack_clicked();
+    QTest::keyPress(screen, Qt::Key_Return);
+    QTest::keyRelease(screen, Qt::Key_Return);
+    QVERIFY(requestedScreens().isEmpty());
+    screen->onClosePopup(screen->popups().back());
     QTest::keyPress(screen, Qt::Key_Return);
     QTRY_COMPARE(requestedScreens(), QList<SCREEN_ID_T>{TARGETING_SCREEN_ID});
     QCOMPARE(m_master->screenCount(), 2);

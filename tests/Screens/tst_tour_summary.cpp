@@ -12,6 +12,7 @@
 
 #include "support/Tour.h"
 
+#include <QThread>
 #include <QtTest>
 
 namespace {
@@ -42,6 +43,14 @@ JobMeasureScreen* summary(QWidget* display, const QString& job, bool sync = fals
 static QList<Tour::Stop> stops()
 {
     return {
+        {"summary_loading",
+         [](QWidget* d) {
+             summary(d, "Job 1");
+             // The data thread is held up, so the next load is still running
+             // when the shot is taken.
+             QMetaObject::invokeMethod(DataManager::instance(), [] { QThread::msleep(800); }, Qt::QueuedConnection);
+             d->findChild<JobMeasureScreen*>()->onUpdateScreen();
+         }},
         {"summary_open", [](QWidget* d) { summary(d, "Job"); }},
         {"summary_complete", [](QWidget* d) { summary(d, "Job 1", true); }},
         {"summary_complete_readings",
