@@ -55,6 +55,7 @@ JobMeasureScreen::JobMeasureScreen(QWidget* parent)
     , m_WebSyncButtonIndex(-1)
 {
     ui->setupUi(this);
+    ui->labelHeader->setFont(pixelFont(22, true));
     ui->labelDeleteText->setFont(pixelFont(11));
     ui->labelSaveText->setFont(pixelFont(11));
     setObjectName(QStringLiteral("JobMeasureScreen"));

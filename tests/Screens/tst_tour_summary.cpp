@@ -58,7 +58,9 @@ static QList<Tour::Stop> stops()
              JobMeasureScreen* s = summary(d, "Job 1", true);
              s->sampleList()->scrollToBottom();
          }},
+        {"summary_open_readings", [](QWidget* d) { summary(d, "Job")->sampleList()->scrollToBottom(); }},
         {"summary_averaged", [](QWidget* d) { summary(d, "Job 2"); }},
+        {"summary_averaged_result", [](QWidget* d) { summary(d, "Job 2")->sampleList()->scrollToBottom(); }},
         {"summary_smc", [](QWidget* d) { summary(d, "Job 5"); }},
         {"summary_smc_readings",
          [](QWidget* d) { summary(d, "Job 5")->sampleList()->scrollToBottom(); }},
