@@ -304,7 +304,7 @@
     </message>
     <message>
         <source>%1 of %2 completed</source>
-        <translation>%1 von %2 abgeschlossen</translation>
+        <translation>%1 von %2 fertig</translation>
     </message>
     <message>
         <source>Delete Job?</source>

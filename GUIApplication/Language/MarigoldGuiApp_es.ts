@@ -304,7 +304,7 @@
     </message>
     <message>
         <source>%1 of %2 completed</source>
-        <translation>%1 de %2 completadas</translation>
+        <translation>%1/%2 completadas</translation>
     </message>
     <message>
         <source>Delete Job?</source>

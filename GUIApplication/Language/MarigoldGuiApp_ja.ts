@@ -304,7 +304,7 @@
     </message>
     <message>
         <source>%1 of %2 completed</source>
-        <translation>%2 件中 %1 件完了</translation>
+        <translation>%1/%2 完了</translation>
     </message>
     <message>
         <source>Delete Job?</source>
