@@ -253,6 +253,85 @@
     </message>
 </context>
 <context>
+    <name>JobMeasureScreen</name>
+    <message>
+        <source>Summary</source>
+        <translation>Übersicht</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Löschen</translation>
+    </message>
+    <message>
+        <source>Measure</source>
+        <translation>Messen</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Speichern</translation>
+    </message>
+    <message>
+        <source>Job Details</source>
+        <translation>Auftragsdetails</translation>
+    </message>
+    <message>
+        <source>Name:</source>
+        <translation>Name:</translation>
+    </message>
+    <message>
+        <source>%1:</source>
+        <translation>%1:</translation>
+    </message>
+    <message>
+        <source>Notes:</source>
+        <translation>Notizen:</translation>
+    </message>
+    <message>
+        <source>Send Job To Server</source>
+        <translation>Auftrag an Server senden</translation>
+    </message>
+    <message>
+        <source>SMC Results</source>
+        <translation>SMC-Ergebnis</translation>
+    </message>
+    <message>
+        <source>Average Results</source>
+        <translation>Mittelwert</translation>
+    </message>
+    <message>
+        <source>Measurements</source>
+        <translation>Messungen</translation>
+    </message>
+    <message>
+        <source>%1 of %2 completed</source>
+        <translation>%1 von %2 fertig</translation>
+    </message>
+    <message>
+        <source>Delete Job?</source>
+        <translation>Auftrag löschen?</translation>
+    </message>
+    <message>
+        <source>The entire job and all samples will be permanently deleted.</source>
+        <translation>Der gesamte Auftrag und alle Proben werden endgültig gelöscht.</translation>
+    </message>
+    <message>
+        <source>Warning</source>
+        <translation>Warnung</translation>
+    </message>
+    <message>
+        <source>This job was not created on the instrument. Are you sure you want to edit the job?</source>
+        <translation>Dieser Auftrag wurde nicht auf dem Gerät erstellt. Möchten Sie ihn wirklich bearbeiten?</translation>
+    </message>
+    <message>
+        <source>Edit</source>
+        <translation>Bearbeiten</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Abbrechen</translation>
+    </message>
+</context>
+<context>
     <name>LockScreen</name>
     <message>
         <source>Instrument Locked</source>
@@ -310,6 +389,13 @@
     <message>
         <source>OK</source>
         <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>SampleListSelectionItemComplete</name>
+    <message>
+        <source>More measurements are needed to complete this job</source>
+        <translation>Für diesen Auftrag sind weitere Messungen nötig</translation>
     </message>
 </context>
 <context>

@@ -253,6 +253,85 @@
     </message>
 </context>
 <context>
+    <name>JobMeasureScreen</name>
+    <message>
+        <source>Summary</source>
+        <translation>Summary</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Delete</translation>
+    </message>
+    <message>
+        <source>Measure</source>
+        <translation>Measure</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Save</translation>
+    </message>
+    <message>
+        <source>Job Details</source>
+        <translation>Job Details</translation>
+    </message>
+    <message>
+        <source>Name:</source>
+        <translation>Name:</translation>
+    </message>
+    <message>
+        <source>%1:</source>
+        <translation>%1:</translation>
+    </message>
+    <message>
+        <source>Notes:</source>
+        <translation>Notes:</translation>
+    </message>
+    <message>
+        <source>Send Job To Server</source>
+        <translation>Send Job To Server</translation>
+    </message>
+    <message>
+        <source>SMC Results</source>
+        <translation>SMC Results</translation>
+    </message>
+    <message>
+        <source>Average Results</source>
+        <translation>Average Results</translation>
+    </message>
+    <message>
+        <source>Measurements</source>
+        <translation>Measurements</translation>
+    </message>
+    <message>
+        <source>%1 of %2 completed</source>
+        <translation>%1 of %2 completed</translation>
+    </message>
+    <message>
+        <source>Delete Job?</source>
+        <translation>Delete Job?</translation>
+    </message>
+    <message>
+        <source>The entire job and all samples will be permanently deleted.</source>
+        <translation>The entire job and all samples will be permanently deleted.</translation>
+    </message>
+    <message>
+        <source>Warning</source>
+        <translation>Warning</translation>
+    </message>
+    <message>
+        <source>This job was not created on the instrument. Are you sure you want to edit the job?</source>
+        <translation>This job was not created on the instrument. Are you sure you want to edit the job?</translation>
+    </message>
+    <message>
+        <source>Edit</source>
+        <translation>Edit</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Cancel</translation>
+    </message>
+</context>
+<context>
     <name>LockScreen</name>
     <message>
         <source>Instrument Locked</source>
@@ -310,6 +389,13 @@
     <message>
         <source>OK</source>
         <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>SampleListSelectionItemComplete</name>
+    <message>
+        <source>More measurements are needed to complete this job</source>
+        <translation>More measurements are needed to complete this job</translation>
     </message>
 </context>
 <context>

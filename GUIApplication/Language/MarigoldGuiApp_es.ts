@@ -253,6 +253,85 @@
     </message>
 </context>
 <context>
+    <name>JobMeasureScreen</name>
+    <message>
+        <source>Summary</source>
+        <translation>Resumen</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Eliminar</translation>
+    </message>
+    <message>
+        <source>Measure</source>
+        <translation>Medir</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Guardar</translation>
+    </message>
+    <message>
+        <source>Job Details</source>
+        <translation>Detalles del trabajo</translation>
+    </message>
+    <message>
+        <source>Name:</source>
+        <translation>Nombre:</translation>
+    </message>
+    <message>
+        <source>%1:</source>
+        <translation>%1:</translation>
+    </message>
+    <message>
+        <source>Notes:</source>
+        <translation>Notas:</translation>
+    </message>
+    <message>
+        <source>Send Job To Server</source>
+        <translation>Enviar trabajo al servidor</translation>
+    </message>
+    <message>
+        <source>SMC Results</source>
+        <translation>Resultado SMC</translation>
+    </message>
+    <message>
+        <source>Average Results</source>
+        <translation>Resultado promedio</translation>
+    </message>
+    <message>
+        <source>Measurements</source>
+        <translation>Mediciones</translation>
+    </message>
+    <message>
+        <source>%1 of %2 completed</source>
+        <translation>%1/%2 completadas</translation>
+    </message>
+    <message>
+        <source>Delete Job?</source>
+        <translation>¿Eliminar trabajo?</translation>
+    </message>
+    <message>
+        <source>The entire job and all samples will be permanently deleted.</source>
+        <translation>El trabajo completo y todas sus muestras se eliminarán de forma permanente.</translation>
+    </message>
+    <message>
+        <source>Warning</source>
+        <translation>Advertencia</translation>
+    </message>
+    <message>
+        <source>This job was not created on the instrument. Are you sure you want to edit the job?</source>
+        <translation>Este trabajo no se creó en el instrumento. ¿Seguro que desea editarlo?</translation>
+    </message>
+    <message>
+        <source>Edit</source>
+        <translation>Editar</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Cancelar</translation>
+    </message>
+</context>
+<context>
     <name>LockScreen</name>
     <message>
         <source>Instrument Locked</source>
@@ -310,6 +389,13 @@
     <message>
         <source>OK</source>
         <translation>Aceptar</translation>
+    </message>
+</context>
+<context>
+    <name>SampleListSelectionItemComplete</name>
+    <message>
+        <source>More measurements are needed to complete this job</source>
+        <translation>Se necesitan más mediciones para completar este trabajo</translation>
     </message>
 </context>
 <context>

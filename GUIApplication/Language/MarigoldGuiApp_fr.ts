@@ -253,6 +253,85 @@
     </message>
 </context>
 <context>
+    <name>JobMeasureScreen</name>
+    <message>
+        <source>Summary</source>
+        <translation>Récapitulatif</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Supprimer</translation>
+    </message>
+    <message>
+        <source>Measure</source>
+        <translation>Mesurer</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Enregistrer</translation>
+    </message>
+    <message>
+        <source>Job Details</source>
+        <translation>Détails du travail</translation>
+    </message>
+    <message>
+        <source>Name:</source>
+        <translation>Nom :</translation>
+    </message>
+    <message>
+        <source>%1:</source>
+        <translation>%1 :</translation>
+    </message>
+    <message>
+        <source>Notes:</source>
+        <translation>Notes :</translation>
+    </message>
+    <message>
+        <source>Send Job To Server</source>
+        <translation>Envoyer le travail au serveur</translation>
+    </message>
+    <message>
+        <source>SMC Results</source>
+        <translation>Résultat SMC</translation>
+    </message>
+    <message>
+        <source>Average Results</source>
+        <translation>Résultat moyen</translation>
+    </message>
+    <message>
+        <source>Measurements</source>
+        <translation>Mesures</translation>
+    </message>
+    <message>
+        <source>%1 of %2 completed</source>
+        <translation>%1 sur %2 terminées</translation>
+    </message>
+    <message>
+        <source>Delete Job?</source>
+        <translation>Supprimer le travail ?</translation>
+    </message>
+    <message>
+        <source>The entire job and all samples will be permanently deleted.</source>
+        <translation>Le travail entier et tous ses échantillons seront définitivement supprimés.</translation>
+    </message>
+    <message>
+        <source>Warning</source>
+        <translation>Avertissement</translation>
+    </message>
+    <message>
+        <source>This job was not created on the instrument. Are you sure you want to edit the job?</source>
+        <translation>Ce travail n&apos;a pas été créé sur l&apos;instrument. Voulez-vous vraiment le modifier ?</translation>
+    </message>
+    <message>
+        <source>Edit</source>
+        <translation>Modifier</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Annuler</translation>
+    </message>
+</context>
+<context>
     <name>LockScreen</name>
     <message>
         <source>Instrument Locked</source>
@@ -310,6 +389,13 @@
     <message>
         <source>OK</source>
         <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>SampleListSelectionItemComplete</name>
+    <message>
+        <source>More measurements are needed to complete this job</source>
+        <translation>D&apos;autres mesures sont nécessaires pour terminer ce travail</translation>
     </message>
 </context>
 <context>

@@ -253,6 +253,85 @@
     </message>
 </context>
 <context>
+    <name>JobMeasureScreen</name>
+    <message>
+        <source>Summary</source>
+        <translation>Riepilogo</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Elimina</translation>
+    </message>
+    <message>
+        <source>Measure</source>
+        <translation>Misura</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>Salva</translation>
+    </message>
+    <message>
+        <source>Job Details</source>
+        <translation>Dettagli del lavoro</translation>
+    </message>
+    <message>
+        <source>Name:</source>
+        <translation>Nome:</translation>
+    </message>
+    <message>
+        <source>%1:</source>
+        <translation>%1:</translation>
+    </message>
+    <message>
+        <source>Notes:</source>
+        <translation>Note:</translation>
+    </message>
+    <message>
+        <source>Send Job To Server</source>
+        <translation>Invia lavoro al server</translation>
+    </message>
+    <message>
+        <source>SMC Results</source>
+        <translation>Risultato SMC</translation>
+    </message>
+    <message>
+        <source>Average Results</source>
+        <translation>Risultato medio</translation>
+    </message>
+    <message>
+        <source>Measurements</source>
+        <translation>Misurazioni</translation>
+    </message>
+    <message>
+        <source>%1 of %2 completed</source>
+        <translation>%1 di %2 completate</translation>
+    </message>
+    <message>
+        <source>Delete Job?</source>
+        <translation>Eliminare il lavoro?</translation>
+    </message>
+    <message>
+        <source>The entire job and all samples will be permanently deleted.</source>
+        <translation>L&apos;intero lavoro e tutti i campioni verranno eliminati definitivamente.</translation>
+    </message>
+    <message>
+        <source>Warning</source>
+        <translation>Avviso</translation>
+    </message>
+    <message>
+        <source>This job was not created on the instrument. Are you sure you want to edit the job?</source>
+        <translation>Questo lavoro non è stato creato sullo strumento. Modificarlo comunque?</translation>
+    </message>
+    <message>
+        <source>Edit</source>
+        <translation>Modifica</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Annulla</translation>
+    </message>
+</context>
+<context>
     <name>LockScreen</name>
     <message>
         <source>Instrument Locked</source>
@@ -310,6 +389,13 @@
     <message>
         <source>OK</source>
         <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>SampleListSelectionItemComplete</name>
+    <message>
+        <source>More measurements are needed to complete this job</source>
+        <translation>Servono altre misurazioni per completare questo lavoro</translation>
     </message>
 </context>
 <context>

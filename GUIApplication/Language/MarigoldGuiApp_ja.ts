@@ -253,6 +253,85 @@
     </message>
 </context>
 <context>
+    <name>JobMeasureScreen</name>
+    <message>
+        <source>Summary</source>
+        <translation>概要</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>削除</translation>
+    </message>
+    <message>
+        <source>Measure</source>
+        <translation>測定</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>保存</translation>
+    </message>
+    <message>
+        <source>Job Details</source>
+        <translation>ジョブの詳細</translation>
+    </message>
+    <message>
+        <source>Name:</source>
+        <translation>名前:</translation>
+    </message>
+    <message>
+        <source>%1:</source>
+        <translation>%1:</translation>
+    </message>
+    <message>
+        <source>Notes:</source>
+        <translation>メモ:</translation>
+    </message>
+    <message>
+        <source>Send Job To Server</source>
+        <translation>ジョブをサーバーに送信</translation>
+    </message>
+    <message>
+        <source>SMC Results</source>
+        <translation>SMC結果</translation>
+    </message>
+    <message>
+        <source>Average Results</source>
+        <translation>平均結果</translation>
+    </message>
+    <message>
+        <source>Measurements</source>
+        <translation>測定値</translation>
+    </message>
+    <message>
+        <source>%1 of %2 completed</source>
+        <translation>%1/%2 完了</translation>
+    </message>
+    <message>
+        <source>Delete Job?</source>
+        <translation>ジョブを削除しますか？</translation>
+    </message>
+    <message>
+        <source>The entire job and all samples will be permanently deleted.</source>
+        <translation>ジョブ全体とすべてのサンプルが完全に削除されます。</translation>
+    </message>
+    <message>
+        <source>Warning</source>
+        <translation>警告</translation>
+    </message>
+    <message>
+        <source>This job was not created on the instrument. Are you sure you want to edit the job?</source>
+        <translation>このジョブは本機で作成されたものではありません。編集してもよろしいですか？</translation>
+    </message>
+    <message>
+        <source>Edit</source>
+        <translation>編集</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>キャンセル</translation>
+    </message>
+</context>
+<context>
     <name>LockScreen</name>
     <message>
         <source>Instrument Locked</source>
@@ -310,6 +389,13 @@
     <message>
         <source>OK</source>
         <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>SampleListSelectionItemComplete</name>
+    <message>
+        <source>More measurements are needed to complete this job</source>
+        <translation>このジョブを完了するには追加の測定が必要です</translation>
     </message>
 </context>
 <context>

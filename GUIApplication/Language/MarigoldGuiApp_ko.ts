@@ -253,6 +253,85 @@
     </message>
 </context>
 <context>
+    <name>JobMeasureScreen</name>
+    <message>
+        <source>Summary</source>
+        <translation>요약</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>삭제</translation>
+    </message>
+    <message>
+        <source>Measure</source>
+        <translation>측정</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>저장</translation>
+    </message>
+    <message>
+        <source>Job Details</source>
+        <translation>작업 세부 정보</translation>
+    </message>
+    <message>
+        <source>Name:</source>
+        <translation>이름:</translation>
+    </message>
+    <message>
+        <source>%1:</source>
+        <translation>%1:</translation>
+    </message>
+    <message>
+        <source>Notes:</source>
+        <translation>메모:</translation>
+    </message>
+    <message>
+        <source>Send Job To Server</source>
+        <translation>작업을 서버로 전송</translation>
+    </message>
+    <message>
+        <source>SMC Results</source>
+        <translation>SMC 결과</translation>
+    </message>
+    <message>
+        <source>Average Results</source>
+        <translation>평균 결과</translation>
+    </message>
+    <message>
+        <source>Measurements</source>
+        <translation>측정값</translation>
+    </message>
+    <message>
+        <source>%1 of %2 completed</source>
+        <translation>%2개 중 %1개 완료</translation>
+    </message>
+    <message>
+        <source>Delete Job?</source>
+        <translation>작업을 삭제하시겠습니까?</translation>
+    </message>
+    <message>
+        <source>The entire job and all samples will be permanently deleted.</source>
+        <translation>작업 전체와 모든 샘플이 영구적으로 삭제됩니다.</translation>
+    </message>
+    <message>
+        <source>Warning</source>
+        <translation>경고</translation>
+    </message>
+    <message>
+        <source>This job was not created on the instrument. Are you sure you want to edit the job?</source>
+        <translation>이 작업은 기기에서 생성되지 않았습니다. 작업을 편집하시겠습니까?</translation>
+    </message>
+    <message>
+        <source>Edit</source>
+        <translation>편집</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>취소</translation>
+    </message>
+</context>
+<context>
     <name>LockScreen</name>
     <message>
         <source>Instrument Locked</source>
@@ -310,6 +389,13 @@
     <message>
         <source>OK</source>
         <translation>확인</translation>
+    </message>
+</context>
+<context>
+    <name>SampleListSelectionItemComplete</name>
+    <message>
+        <source>More measurements are needed to complete this job</source>
+        <translation>이 작업을 완료하려면 측정이 더 필요합니다</translation>
     </message>
 </context>
 <context>

@@ -253,6 +253,85 @@
     </message>
 </context>
 <context>
+    <name>JobMeasureScreen</name>
+    <message>
+        <source>Summary</source>
+        <translation>摘要</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>删除</translation>
+    </message>
+    <message>
+        <source>Measure</source>
+        <translation>测量</translation>
+    </message>
+    <message>
+        <source>Save</source>
+        <translation>保存</translation>
+    </message>
+    <message>
+        <source>Job Details</source>
+        <translation>任务详情</translation>
+    </message>
+    <message>
+        <source>Name:</source>
+        <translation>名称：</translation>
+    </message>
+    <message>
+        <source>%1:</source>
+        <translation>%1：</translation>
+    </message>
+    <message>
+        <source>Notes:</source>
+        <translation>备注：</translation>
+    </message>
+    <message>
+        <source>Send Job To Server</source>
+        <translation>发送任务到服务器</translation>
+    </message>
+    <message>
+        <source>SMC Results</source>
+        <translation>SMC 结果</translation>
+    </message>
+    <message>
+        <source>Average Results</source>
+        <translation>平均结果</translation>
+    </message>
+    <message>
+        <source>Measurements</source>
+        <translation>测量结果</translation>
+    </message>
+    <message>
+        <source>%1 of %2 completed</source>
+        <translation>已完成 %1/%2</translation>
+    </message>
+    <message>
+        <source>Delete Job?</source>
+        <translation>删除任务？</translation>
+    </message>
+    <message>
+        <source>The entire job and all samples will be permanently deleted.</source>
+        <translation>整个任务及所有样品将被永久删除。</translation>
+    </message>
+    <message>
+        <source>Warning</source>
+        <translation>警告</translation>
+    </message>
+    <message>
+        <source>This job was not created on the instrument. Are you sure you want to edit the job?</source>
+        <translation>此任务不是在本仪器上创建的。确定要编辑该任务吗？</translation>
+    </message>
+    <message>
+        <source>Edit</source>
+        <translation>编辑</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>取消</translation>
+    </message>
+</context>
+<context>
     <name>LockScreen</name>
     <message>
         <source>Instrument Locked</source>
@@ -310,6 +389,13 @@
     <message>
         <source>OK</source>
         <translation>确定</translation>
+    </message>
+</context>
+<context>
+    <name>SampleListSelectionItemComplete</name>
+    <message>
+        <source>More measurements are needed to complete this job</source>
+        <translation>完成此任务还需要更多测量</translation>
     </message>
 </context>
 <context>

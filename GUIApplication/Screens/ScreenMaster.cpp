@@ -5,6 +5,7 @@
 #include "Screens/DaddyPanel.h"
 #include "Screens/JobEditScreens.h"
 #include "Screens/JobListScreen.h"
+#include "Screens/JobMeasureScreen.h"
 #include "Screens/LockScreen.h"
 #include "Screens/SadPuppyScreen.h"
 #include "Screens/SyncScreen.h"
@@ -142,6 +143,7 @@ QWidget* ScreenMaster::createScreen(SCREEN_ID_T id)
     // Screens of later parts join this list as they are built.
     switch (id) {
     case JOB_LIST_SCREEN_ID: return new JobListScreen(this);
+    case JOB_MEASURE_SCREEN_ID: return new JobMeasureScreen(this);
     case SYNC_SCREEN_ID: return new SyncScreen(this);
     case LOCK_SCREEN_ID: return new LockScreen(this);
     case SAD_PUPPY_POPUP_SCREEN_ID: return new SadPuppyScreen(this);
