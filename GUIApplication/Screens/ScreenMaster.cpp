@@ -3,9 +3,11 @@
 #include "GUIAPI/API_SignalMaster.h"
 #include "GUIAPI/DataManager.h"
 #include "Screens/DaddyPanel.h"
+#include "Screens/ImageViewScreen.h"
 #include "Screens/JobListScreen.h"
 #include "Screens/LockScreen.h"
 #include "Screens/SadPuppyScreen.h"
+#include "Screens/SampleViewScreen.h"
 #include "Screens/SyncScreen.h"
 #include "SharedSystem/LocaleHelper.h"
 #include "SharedSystem/Platform.h"
@@ -144,6 +146,8 @@ QWidget* ScreenMaster::createScreen(SCREEN_ID_T id)
     case SYNC_SCREEN_ID: return new SyncScreen(this);
     case LOCK_SCREEN_ID: return new LockScreen(this);
     case SAD_PUPPY_POPUP_SCREEN_ID: return new SadPuppyScreen(this);
+    case SAMPLE_VIEW_SCREEN_ID: return new SampleViewScreen(this);
+    case IMAGE_VIEW_SCREEN_ID: return new ImageViewScreen(this);
     default: return nullptr;
     }
 }

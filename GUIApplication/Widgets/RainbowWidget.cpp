@@ -186,7 +186,11 @@ void RainbowWidget::drawScaleNumbers(bool bothRings)
     };
     for (const Stop& s : kTopStops)
         place(s.angle, 140.0, Theme::FontSmall);
-    if (bothRings)
+    // The inner figures stand close together: every other one a step
+    // further in, so that neighbours don't touch.
+    if (bothRings) {
+        int i = 0;
         for (const Stop& s : kBottomStops)
-            place(s.angle, 46.0, 8);
+            place(s.angle, (i++ % 2) ? 33.0 : 47.0, 8);
+    }
 }

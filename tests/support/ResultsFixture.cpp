@@ -18,37 +18,54 @@ namespace ResultsFixture {
 
 #ifdef MARIGOLD_HAVE_SIM
 namespace {
-Sim::ServerThread* g_sim = nullptr;
-}
+// One simulator per instrument model, started on first use; the link
+// follows the one asked for last.
+Sim::ServerThread* g_sims[2] = {nullptr, nullptr};
+int g_current = -1;
+} // namespace
 #endif
 
 bool start(bool elevenAngles)
 {
 #ifdef MARIGOLD_HAVE_SIM
-    static const bool started = [elevenAngles] {
+    const int k = elevenAngles ? 1 : 0;
+    if (g_current == k)
+        return true;
+    static const bool shellReady = [] {
         AppShell::registerMetaTypes();
         LocaleHelper::Init();
         StringTables::Init();
-        g_sim = new Sim::ServerThread;
-        g_sim->options().port = TestSupport::freeLocalPort();
-        g_sim->options().controlPort = -1;
-        g_sim->options().instrument.dataDir = TestSupport::makeTempDir(QStringLiteral("results-sim"));
-        g_sim->options().instrument.seed = 11;
-        g_sim->options().instrument.timeScale = 0.2;
-        g_sim->options().instrument.model = elevenAngles ? Sim::Model::Alder : Sim::Model::Birch;
-        if (!g_sim->start())
-            return false;
-        setIpAddress(QStringLiteral("127.0.0.1"));
-        setIpPort(g_sim->port());
-        Commands::Init();
-        Commands::instance()->tcpClient()->connectToHost();
-        DataManager* data = DataManager::instance();
-        data->onSync();
-        data->setSystemStatus(Tour::workshopStatus());
-        data->updateJobInfos();
-        return data->getNumberOfJobs() > 0;
+        return true;
     }();
-    return started;
+    Q_UNUSED(shellReady);
+    if (!g_sims[k]) {
+        auto* sim = new Sim::ServerThread;
+        sim->options().port = TestSupport::freeLocalPort();
+        sim->options().controlPort = -1;
+        sim->options().instrument.dataDir =
+            TestSupport::makeTempDir(elevenAngles ? QStringLiteral("results-sim11") : QStringLiteral("results-sim6"));
+        sim->options().instrument.seed = 11;
+        sim->options().instrument.timeScale = 0.2;
+        sim->options().instrument.model = elevenAngles ? Sim::Model::Alder : Sim::Model::Birch;
+        if (!sim->start()) {
+            delete sim;
+            return false;
+        }
+        g_sims[k] = sim;
+    }
+    setIpAddress(QStringLiteral("127.0.0.1"));
+    setIpPort(g_sims[k]->port());
+    if (g_current < 0)
+        Commands::Init();
+    else
+        Commands::instance()->tcpClient()->Init();
+    Commands::instance()->tcpClient()->connectToHost();
+    g_current = k;
+    DataManager* data = DataManager::instance();
+    data->onSync();
+    data->setSystemStatus(Tour::workshopStatus());
+    data->updateJobInfos();
+    return data->getNumberOfJobs() > 0;
 #else
     Q_UNUSED(elevenAngles);
     return false;
@@ -58,7 +75,7 @@ bool start(bool elevenAngles)
 QString control(const QString& line)
 {
 #ifdef MARIGOLD_HAVE_SIM
-    return g_sim ? g_sim->control(line) : QString();
+    return g_current >= 0 ? g_sims[g_current]->control(line) : QString();
 #else
     Q_UNUSED(line);
     return QString();

@@ -2,9 +2,9 @@
 #define RESULTSFIXTURE_H
 
 // The result views need a stored sample with its colour, textures and
-// pictures. This starts the simulator's demo set once per program, of the
-// 6-angle or the 11-angle instrument, reads it over a real link, and makes a
-// demo job's sample the active one.
+// pictures. This serves the simulator's demo set of the 6-angle or the
+// 11-angle instrument, reads it over a real link, and makes a demo job's
+// sample the active one.
 
 #include <QString>
 
@@ -12,6 +12,9 @@ namespace ResultsFixture {
 
 // False when the simulator could not be started or served no jobs.
 bool start(bool elevenAngles);
+
+// Asking for the other model starts its simulator too and moves the link
+// to it.
 
 // A control line to the simulator, with its reply.
 QString control(const QString& line);
