@@ -59,9 +59,9 @@ SampleViewScreen* sampleView(QWidget* display, bool eleven, const QString& job, 
     return screen;
 }
 
-void images(QWidget* display, bool eleven, const QString& job, int angle)
+void images(QWidget* display, bool eleven, const QString& job, int angle, unsigned int sample = 0)
 {
-    if (!open(eleven, job))
+    if (!open(eleven, job, sample))
         return;
     ResultsFixture::loadTexturesAndImages();
     DataManager::instance()->setActiveImage(static_cast<IMAGE_ANGLE_T>(angle));
@@ -97,7 +97,7 @@ static QList<Tour::Stop> stops()
          }},
         {"results6_images_metallic", [](QWidget* d) { settings(); images(d, false, "Job", 1); }},
         {"results6_images_solid", [](QWidget* d) { settings(); images(d, false, "Job 1", 3); }},
-        {"results6_images_pearl_diffuse", [](QWidget* d) { settings(); images(d, false, "Job 6", 5); }},
+        {"results6_images_pearl_diffuse", [](QWidget* d) { settings(); images(d, false, "Job 2", 5, 255); }},
         // 11 angles
         {"results11_metallic_rainbow", [](QWidget* d) { settings(); sampleView(d, true, "Job", 0); }},
         {"results11_metallic_lab45", [](QWidget* d) { settings(); sampleView(d, true, "Job", 1); }},
@@ -105,7 +105,7 @@ static QList<Tour::Stop> stops()
         {"results11_metallic_texture", [](QWidget* d) { settings(); sampleView(d, true, "Job", -1); }},
         {"results11_solid_rainbow", [](QWidget* d) { settings(); sampleView(d, true, "Job 1", 0); }},
         {"results11_solid_lab15", [](QWidget* d) { settings(); sampleView(d, true, "Job 1", 2, 3); }},
-        {"results11_pearl_rainbow", [](QWidget* d) { settings(); sampleView(d, true, "Job 6", 0); }},
+        {"results11_pearl_rainbow", [](QWidget* d) { settings(); sampleView(d, true, "Job 2", 0, 0, 255); }},
         {"results11_images_metallic", [](QWidget* d) { settings(); images(d, true, "Job", 0); }},
         {"results11_metallic_lab45_de", [](QWidget* d) { settings(); sampleView(d, true, "Job", 1); }, "de"},
     };
