@@ -78,10 +78,22 @@ QByteArray renderCoating(const Coating& c, int width, int height, int originX, i
                     spark = c.sparkleIntensity * (0.5 + 0.5 * unit(ch >> 4)) * std::exp(-d2 / 1.2);
                 }
             }
+            double glint = 0.0;
+            if (c.shimmer > 0.0) {
+                // Platelets lie one per 7 x 7 cell at most and glow over a few pixels.
+                const int pc = 7;
+                const int gx = (wx >= 0 ? wx : wx - pc + 1) / pc, gy = (wy >= 0 ? wy : wy - pc + 1) / pc;
+                const quint32 ph = hash3(quint32(gx), quint32(gy), c.seed ^ 0x85ebca6bu);
+                if (unit(ph) < 0.45) {
+                    const double sx = gx * pc + 1.5 + (ph >> 24 & 3), sy = gy * pc + 1.5 + (ph >> 26 & 3);
+                    const double d2 = (wx - sx) * (wx - sx) + (wy - sy) * (wy - sy);
+                    glint = c.shimmer * (0.4 + 0.6 * unit(ph >> 5)) * std::exp(-d2 / 5.0);
+                }
+            }
             const double light = c.light * shade;
-            *p++ = clampByte(r0 * light + 255.0 * spark);
-            *p++ = clampByte(g0 * light + 255.0 * spark);
-            *p++ = clampByte(b0 * light + 255.0 * spark);
+            *p++ = clampByte(r0 * light + 255.0 * spark + c.glintTint.red() * glint);
+            *p++ = clampByte(g0 * light + 255.0 * spark + c.glintTint.green() * glint);
+            *p++ = clampByte(b0 * light + 255.0 * spark + c.glintTint.blue() * glint);
         }
     }
     return out;
@@ -100,6 +112,20 @@ QByteArray samplePicture(const Sample& sample, int imageAngle, int width, int he
         r[w] = sample.reflectance(geometry, w);
     Coating c;
     c.base = Colour::screenColour(r);
+    // The camera sets its exposure: a bright metallic near the gloss is not
+    // burnt out to white, and the flakes keep room above the coating.
+    const int peak = std::max({c.base.red(), c.base.green(), c.base.blue()});
+    if (peak > 200)
+        c.light = 200.0 / peak;
+    const Finish& finish = Spectra::finish(sample.finish);
+    if (finish.kind == Finish::Pearl && imageAngle != IMAGE_DIFFUSE) {
+        // The interference colour: the coating's hue, cleaner and lighter,
+        // strongest near the gloss.
+        QColor tint = QColor::fromHsvF(c.base.hueF() < 0 ? 0.0 : c.base.hueF(),
+                                       std::min(1.0, c.base.saturationF() * 1.6 + 0.15), 1.0);
+        c.glintTint = tint;
+        c.shimmer = 0.55 * std::exp(-std::fabs(kCameraAspecular[imageAngle]) / 50.0) + 0.12;
+    }
     const float* t = sample.texture.size() >= (imageAngle + 1) * kTextureFigures
         ? sample.texture.constData() + imageAngle * kTextureFigures
         : nullptr;

@@ -45,6 +45,10 @@ struct Coating {
     double sparkleDensity = 0.0;  // sparkles per 100 pixels
     double sparkleIntensity = 0.0; // 0..1, added brightness of a sparkle's centre
     double light = 1.0;           // overall illumination
+    // Pearl: soft glints of the interference colour, larger and dimmer
+    // than a metal flake's.
+    QColor glintTint;
+    double shimmer = 0.0;         // 0..1, brightness of the glints
     quint32 seed = 1;
 };
 // Renders a window of an endless coating starting at (originX, originY).

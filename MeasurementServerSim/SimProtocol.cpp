@@ -50,10 +50,11 @@ struct TextureName {
     int figure;
     const char* name;
 };
+// Named as the instrument names them: short codes, coarseness "C" and
+// sparkle grade "SG" among them.
 const TextureName kDirectionalParameters[] = {
-    {3, "Sparkle Area"}, {4, "Sparkle Intensity"}, {5, "Sparkle Grade"}, {6, "Sparkle Density"},
-    {2, "Directional Coarseness"}};
-const TextureName kDiffuseParameters[] = {{0, "Coarseness"}, {1, "Background Coarseness"}};
+    {3, "SA"}, {4, "SI"}, {5, "SG"}, {6, "SD"}, {2, "C"}};
+const TextureName kDiffuseParameters[] = {{0, "C"}, {1, "CB"}};
 
 } // namespace
 

@@ -4,10 +4,12 @@
 #include "GUIAPI/DataManager.h"
 #include "Screens/DaddyPanel.h"
 #include "Screens/JobEditScreens.h"
+#include "Screens/ImageViewScreen.h"
 #include "Screens/JobListScreen.h"
 #include "Screens/JobMeasureScreen.h"
 #include "Screens/LockScreen.h"
 #include "Screens/SadPuppyScreen.h"
+#include "Screens/SampleViewScreen.h"
 #include "Screens/SyncScreen.h"
 #include "SharedSystem/LocaleHelper.h"
 #include "SharedSystem/Platform.h"
@@ -155,6 +157,8 @@ QWidget* ScreenMaster::createScreen(SCREEN_ID_T id)
     case JOB_TAGS_2_FREE_EDIT_SCREEN_ID: return new JobTagFreeEditScreen(TAG_STATE_2, this);
     case JOB_TAGS_3_FREE_EDIT_SCREEN_ID: return new JobTagFreeEditScreen(TAG_STATE_3, this);
     case JOB_FREE_TEXT_SCREEN_ID: return new JobFreeTextEditScreen(this);
+    case SAMPLE_VIEW_SCREEN_ID: return new SampleViewScreen(this);
+    case IMAGE_VIEW_SCREEN_ID: return new ImageViewScreen(this);
     default: return nullptr;
     }
 }

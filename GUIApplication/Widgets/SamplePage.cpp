@@ -1,0 +1,6 @@
+#include "Widgets/SamplePage.h"
+
+SamplePage::SamplePage(QWidget* parent)
+    : MarigoldPanel(parent)
+{
+}
