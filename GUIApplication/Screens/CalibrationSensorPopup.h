@@ -37,7 +37,7 @@ private slots:
     void on_BtnOkay_clicked();
     void on_BtnCancel_clicked();
 
-private:
+protected:
     Ui::CalibrationSensorPopup* ui;
     QTimer m_pressureSensorTimer;
     bool m_lamps[3] = {false, false, false};

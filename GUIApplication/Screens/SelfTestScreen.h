@@ -51,7 +51,7 @@ protected:
 private slots:
     void on_okBtn_clicked();
 
-private:
+protected:
     void closeSelfTestPopup();
     void setStatus(std::function<QString()> text);
 
