@@ -38,6 +38,7 @@ private slots:
     void whiteTileRunWithPassFailAndError();
     void cancelEndsTheRunAndOkGoesOn();
     void liftedRunNeedsNoPopups();
+    void repeatedNameGivesTheResultToTheFirstRow();
 
 private:
     QString control(const QString& line) { return m_sim.control(line); }
@@ -205,6 +206,25 @@ void tst_SelfTest::liftedRunNeedsNoPopups()
     QSignalSpy done(API_SignalMaster::instance(), &API_SignalMaster::SelfTestOtherComplete);
     screen->findChild<QPushButton*>("okBtn")->click();
     QCOMPARE(done.count(), 1);
+}
+
+void tst_SelfTest::repeatedNameGivesTheResultToTheFirstRow()
+{
+    // A firmware that lists one name twice: the second run's result lands
+    // on the first row as well, and the second row stays empty.
+    const QString added = control("selftest add \"CHECK ERROR LOGS\" lifted 300");
+    QVERIFY2(added.startsWith("OK test "), qPrintable(added));
+    const int num = added.section(' ', 2, 2).toInt();
+    control("lift");
+    m_master->onAddScreenToStack(SELF_TEST_SCREEN_LIFTED_ID);
+    SelfTestScreen* screen = selfTest();
+    QCOMPARE(screen->rowCount(), 4);
+    QCOMPARE(screen->row(2)->getTestName(), screen->row(3)->getTestName());
+    control(QStringLiteral("selftest %1 2").arg(num));
+    QTRY_VERIFY_WITH_TIMEOUT(screen->isOkShown(), 15000);
+    QCOMPARE(screen->row(2)->resultText(), QString("Fail"));
+    QCOMPARE(screen->row(3)->resultText(), QString());
+    QCOMPARE(screen->testCounter(), 5);
 }
 
 QTEST_MAIN(tst_SelfTest)
