@@ -32,6 +32,7 @@ const char* const kHelp[] = {
     "request white|refcheck|none   ask the user for a white calibration or a reference check",
     "refcheck pass|fail|auto       outcome of the next reference checks",
     "selftest NUM RESULT|auto      force the result of a self test",
+    "selftest add NAME white|effect|lifted MS   one more self test (names may repeat)",
     "online start [NAME] [none|avg3|avg5|smc M N] | online end",
     "temperature CELSIUS           sample surface temperature",
     "instrument-temperature CELSIUS",
@@ -314,6 +315,14 @@ QString Control::dispatch(const QString& command, const QStringList& a)
             return err(QStringLiteral("usage: refcheck pass|fail|auto"));
         ins.forceReferenceResult(r == 2 ? -1 : r);
         return ok();
+    }
+    if (command == QLatin1String("selftest") && n > 0 && a[0].toLower() == QLatin1String("add")) {
+        static const QStringList where = {QStringLiteral("white"), QStringLiteral("effect"), QStringLiteral("lifted")};
+        const int location = n == 4 ? where.indexOf(a[2].toLower()) : -1;
+        if (location < 0 || a[1].isEmpty() || !toInt(a[3], &v) || v < 0)
+            return err(QStringLiteral("usage: selftest add NAME white|effect|lifted MS"));
+        const quint32 num = ins.addSelfTest(a[1], quint32(location), quint32(v));
+        return ok(QStringLiteral("test %1").arg(num));
     }
     if (command == QLatin1String("selftest")) {
         int result = -1;

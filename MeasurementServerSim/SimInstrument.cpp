@@ -648,6 +648,14 @@ STATUS_T Instrument::selfTestResult(quint32 num, qint32* result) const
     return ST_OK;
 }
 
+quint32 Instrument::addSelfTest(const QString& name, quint32 location, quint32 durationMs)
+{
+    TEST t = makeTest("", location, durationMs, quint32(m_selfTests.size()));
+    t.description = name;
+    m_selfTests << t;
+    return t.num;
+}
+
 void Instrument::forceSelfTestResult(quint32 num, qint32 result)
 {
     if (result < 0)

@@ -181,6 +181,8 @@ public:
     // -1 automatic, 0 fail, 1 pass.
     void forceReferenceResult(int result) { m_forceReference = result; }
     void forceSelfTestResult(quint32 num, qint32 result);
+    // Appends a test to the list (a firmware with more tests); its number.
+    quint32 addSelfTest(const QString& name, quint32 location, quint32 durationMs);
     void setTargetingTimeout(int seconds) { m_targetingTimeoutS = seconds; }
     STATUS_T startOnlineJob(const QString& name, const QString& modeText, int size, int maxSamples, QString* created);
     void endOnlineJob();

@@ -2,6 +2,8 @@
 
 #include "GUIAPI/API_SignalMaster.h"
 #include "GUIAPI/DataManager.h"
+#include "Screens/CalibrationWizard.h"
+#include "Screens/CalibrationWizardScreen.h"
 #include "Screens/DaddyPanel.h"
 #include "Screens/JobEditScreens.h"
 #include "Screens/ImageViewScreen.h"
@@ -10,6 +12,7 @@
 #include "Screens/LockScreen.h"
 #include "Screens/SadPuppyScreen.h"
 #include "Screens/SampleViewScreen.h"
+#include "Screens/SelfTestScreen.h"
 #include "Screens/SyncScreen.h"
 #include "SharedSystem/LocaleHelper.h"
 #include "SharedSystem/Platform.h"
@@ -159,6 +162,25 @@ QWidget* ScreenMaster::createScreen(SCREEN_ID_T id)
     case JOB_FREE_TEXT_SCREEN_ID: return new JobFreeTextEditScreen(this);
     case SAMPLE_VIEW_SCREEN_ID: return new SampleViewScreen(this);
     case IMAGE_VIEW_SCREEN_ID: return new ImageViewScreen(this);
+    case CAL_WIZARD_SCREEN_ID: return new CalibrationWizard(this);
+    case CAL_WIZARD_STEPS_INSTRUCTIONS_ID: return new CalibrationWizardScreen(CALIBRATION_WHITE_STATE, this);
+    case CAL_WIZARD_STEPS_REF_CHECK_INSTRUCTIONS_ID:
+        return new CalibrationWizardScreen(CALIBRATION_REFERENCE_CHECK_STATE, this);
+    case CAL_WIZARD_STEPS_SELF_TEST_WHITE_INSTRUCTIONS_ID:
+        return new CalibrationWizardScreen(CALIBRATION_SELF_TEST_WHITE_STATE, this);
+    case CAL_WIZARD_STEPS_SELF_TEST_REFERENCE_INSTRUCTIONS_ID:
+        return new CalibrationWizardScreen(CALIBRATION_SELF_TEST_REFERENCE_CHECK_STATE, this);
+    case CAL_WIZARD_STEPS_SELF_TEST_OTHER_INSTRUCTIONS_ID:
+        return new CalibrationWizardScreen(CALIBRATION_SELF_TEST_OTHER_STATE, this);
+    case SELF_TEST_SCREEN_WHITE_ID: return new SelfTestScreen(SELF_TEST_WHITE_TILE, this);
+    case SELF_TEST_SCREEN_EFFECT_ID: return new SelfTestScreen(SELF_TEST_EFFECT_TILE, this);
+    case SELF_TEST_SCREEN_LIFTED_ID: return new SelfTestScreen(SELF_TEST_DEVICE_LIFTED, this);
+    // The calibration popups are raised by the screens that own them, never
+    // stacked by id: the stack stays as it is.
+    case CAL_ENTRY_POPUP_SCREEN_ID:
+    case CALIBRATING_POPUP_SCREEN_ID:
+    case CAL_IMMINENT_POPUP_SCREEN_ID:
+    case CAL_NEEDED_POPUP_SCREEN_ID: return nullptr;
     default: return nullptr;
     }
 }
