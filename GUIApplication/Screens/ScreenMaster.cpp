@@ -2,9 +2,11 @@
 
 #include "GUIAPI/API_SignalMaster.h"
 #include "GUIAPI/DataManager.h"
+#include "Screens/ConfigMainScreen.h"
 #include "Screens/DaddyPanel.h"
 #include "Screens/JobListScreen.h"
 #include "Screens/LockScreen.h"
+#include "Screens/RestoreFactorySettingsPopup.h"
 #include "Screens/SadPuppyScreen.h"
 #include "Screens/SyncScreen.h"
 #include "SharedSystem/LocaleHelper.h"
@@ -144,6 +146,9 @@ QWidget* ScreenMaster::createScreen(SCREEN_ID_T id)
     case SYNC_SCREEN_ID: return new SyncScreen(this);
     case LOCK_SCREEN_ID: return new LockScreen(this);
     case SAD_PUPPY_POPUP_SCREEN_ID: return new SadPuppyScreen(this);
+    case CONFIG_MAIN_SCREEN_ID: return new ConfigMainScreen(this);
+    case RESTORE_FACTORY_SETTINGS_POPUP_SCREEN_ID: return new RestoreFactorySettingsPopup(this);
+    case DELETE_ALL_SAMPLES_POPUP_SCREEN_ID: return new DeleteAllSamplesPopup(this);
     default: return nullptr;
     }
 }
