@@ -14,6 +14,8 @@ ConfirmationCircleWidget::ConfirmationCircleWidget(QWidget* parent)
     ui->backgroundCircle->setAttribute(Qt::WA_TransparentForMouseEvents);
     ui->draggingCircle->setAttribute(Qt::WA_TransparentForMouseEvents);
     m_confirmationArea = ui->draggingCircle->geometry();
+    // Moves count only while the dot is held; tracking lets every move in.
+    setMouseTracking(true);
 }
 
 ConfirmationCircleWidget::~ConfirmationCircleWidget()

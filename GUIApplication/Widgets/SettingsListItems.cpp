@@ -17,11 +17,12 @@ KLabel* rowLabel(QWidget* parent, const QRect& box, int pointSize, bool bold, co
                  Qt::Alignment alignment = Qt::AlignLeft | Qt::AlignVCenter)
 {
     KLabel* label = new KLabel(parent);
+    // The style sheet first: polishing must not undo the fitted font.
+    label->setStyleSheet(QStringLiteral("color: %1; background: transparent;").arg(Theme::css(colour)));
     label->setGeometry(box);
     label->setFont(Theme::font(pointSize, bold));
     label->setAutoSize(true);
     label->setAlignment(alignment);
-    label->setStyleSheet(QStringLiteral("color: %1; background: transparent;").arg(Theme::css(colour)));
     label->setAttribute(Qt::WA_TransparentForMouseEvents);
     return label;
 }
@@ -234,7 +235,7 @@ SettingsListSelectionToggleItem::SettingsListSelectionToggleItem(QWidget* parent
     : FlickButton(parent)
 {
     makeRow(this, SettingsRows::RowHeight, false);
-    m_label = rowLabel(this, QRect(20, 0, 214, SettingsRows::RowHeight), Theme::FontHeadline, false,
+    m_label = rowLabel(this, QRect(20, 0, 220, SettingsRows::RowHeight), Theme::FontHeadline, false,
                        Theme::TextBody);
     m_button = new SettingsToggleSwitch(this);
     m_button->setObjectName(QStringLiteral("BtnToggle"));

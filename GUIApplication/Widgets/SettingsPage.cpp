@@ -10,7 +10,6 @@
 
 namespace {
 // The visible part of the back button starts here in its own picture.
-const int kBackButtonHiddenWidth = 45;
 const int kTitleIconGap = 5;
 } // namespace
 
@@ -43,6 +42,7 @@ SettingsPage::~SettingsPage()
 void SettingsPage::construct(const QString& title, const QString& icon)
 {
     ui->setupUi(this);
+    ui->labelSubHeader->setWordWrap(true);
     ui->labelSubHeader->setAutoSize(true);
     ui->SettingsList->setShadowsEnabled(true);
     m_signalMapper = new QSignalMapper(this);
@@ -127,17 +127,29 @@ void SettingsPage::onUpdatePage()
 
 void SettingsPage::updateIconLocation()
 {
-    if (ui->labelIcon->pixmap() == nullptr || ui->labelIcon->pixmap()->isNull())
-        return;
-    const QFontMetrics metrics(ui->labelSubHeader->font());
+    // The icon stands left of the centred title, and the two move together
+    // as one group; a title too long for the bar with its icon shrinks.
+    const QPixmap* icon = ui->labelIcon->pixmap();
+    const bool hasIcon = icon && !icon->isNull();
+    const int left = 62;
+    const int right = 310;
     int textWidth = 0;
-    for (const QString& line : ui->labelSubHeader->text().split('\n'))
+    const QFontMetrics metrics(ui->labelSubHeader->defaultFont());
+    for (const QString& line : ui->labelSubHeader->defaultText().split('\n'))
         textWidth = qMax(textWidth, metrics.horizontalAdvance(line));
-    const QRect header = ui->labelSubHeader->geometry();
-    int x = header.center().x() - textWidth / 2 - kTitleIconGap - ui->labelIcon->width();
-    // Never under the back button's visible part.
-    x = qMax(x, ui->BtnBack->geometry().right() - kBackButtonHiddenWidth + 8);
+    textWidth += 4;
+    if (!hasIcon) {
+        ui->labelSubHeader->setGeometry(left, 0, 198, ui->labelSubHeader->height());
+        ui->labelSubHeader->setText(ui->labelSubHeader->defaultText());
+        return;
+    }
+    const int iconWidth = ui->labelIcon->width();
+    textWidth = qMin(textWidth, right - left - iconWidth - kTitleIconGap);
+    const int groupWidth = iconWidth + kTitleIconGap + textWidth;
+    const int x = qBound(left, width() > 0 ? 160 - groupWidth / 2 : left, right - groupWidth);
     ui->labelIcon->move(x, ui->labelIcon->y());
+    ui->labelSubHeader->setGeometry(x + iconWidth + kTitleIconGap, 0, textWidth, ui->labelSubHeader->height());
+    ui->labelSubHeader->setText(ui->labelSubHeader->defaultText());
 }
 
 void SettingsPage::onGotoScreen(SCREEN_ID_T id)

@@ -59,9 +59,9 @@ void SettingsListSelectionSliderItem::build(bool compressed)
 
     labelSummaryText = new KLabel(this);
     labelSummaryText->setObjectName(QStringLiteral("labelSummaryText"));
+    labelSummaryText->setStyleSheet(QStringLiteral("color: %1; background: transparent;").arg(Theme::css(Theme::TextBody)));
     labelSummaryText->setFont(Theme::font(compressed ? Theme::FontBody : Theme::FontHeadline));
     labelSummaryText->setAutoSize(true);
-    labelSummaryText->setStyleSheet(QStringLiteral("color: %1; background: transparent;").arg(Theme::css(Theme::TextBody)));
     labelSummaryText->setGeometry(20, compressed ? 6 : 12, 214, compressed ? 30 : 34);
 
     labelEntryField = new QLabel(this);
