@@ -103,8 +103,12 @@ void SettingsListSelectionSliderItem::onActionTriggered(int action)
 {
     // Steps and page steps come from taps beside the handle: each is a
     // decision of its own. A drag is reported when it ends.
-    if (action >= QAbstractSlider::SliderSingleStepAdd && action <= QAbstractSlider::SliderPageStepSub)
+    if (action >= QAbstractSlider::SliderSingleStepAdd && action <= QAbstractSlider::SliderPageStepSub) {
+        // The slider takes the new value only after this signal; whoever
+        // listens must already read it.
+        horizontalSlider->setValue(horizontalSlider->sliderPosition());
         emit sliderChanged(horizontalSlider->sliderPosition());
+    }
 }
 
 void SettingsListSelectionSliderItem::onValueChanged(int value)

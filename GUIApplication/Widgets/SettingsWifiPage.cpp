@@ -165,8 +165,7 @@ void SettingsWifiPage::refreshSignalMapper()
     m_signalMapperDelete = new QSignalMapper(this);
     m_signalMapperClickedUnknown = new QSignalMapper(this);
     connect(m_signalMapperDelete, &QSignalMapper::mappedString, this, &SettingsWifiPage::onRemoveSSID);
-    connect(m_signalMapperClickedUnknown, &QSignalMapper::mappedObject, this,
-            [this](QObject* row) { onUnknownNetworkClicked(qobject_cast<QWidget*>(row)); });
+    connect(m_signalMapperClickedUnknown, &QSignalMapper::mappedWidget, this, &SettingsWifiPage::onUnknownNetworkClicked);
 }
 
 void SettingsWifiPage::clearList()
@@ -463,9 +462,11 @@ void SettingsWifiPage::OnPasswordEntryComplete(const QString& password)
     m_joining = true;
     QPointer<SettingsWifiPage> self(this);
     const NETWORK_DESCRIPTION_T network = m_networkDescriptionBuffer;
-    retryWhileBusy([&]() { return CmdOut_AddWifiSetting(network, password, 0); });
+    const STATUS_T added = retryWhileBusy([&]() { return CmdOut_AddWifiSetting(network, password, 0); });
     if (!self)
         return;
+    if (added != 0)
+        qDebug().noquote() << QString("Wi-Fi: joining \"%1\" refused, status %2").arg(network.SSID).arg(added);
     SysAPI_TriggerWifiScan();
 
     // The join takes the radio a while; the user waits for its outcome.
@@ -480,6 +481,7 @@ void SettingsWifiPage::OnPasswordEntryComplete(const QString& password)
         if (CmdOut_VerifyWifiSettings(network.SSID, &result) == 0)
             break;
     }
+    qDebug().noquote() << QString("Wi-Fi: joining \"%1\" gave %2").arg(network.SSID).arg(result);
     m_joining = false;
 
     if (result == 1 || result == 2) {
