@@ -4,12 +4,14 @@
 #include "GUIAPI/DataManager.h"
 #include "Screens/CalibrationWizard.h"
 #include "Screens/CalibrationWizardScreen.h"
+#include "Screens/ConfigMainScreen.h"
 #include "Screens/DaddyPanel.h"
 #include "Screens/JobEditScreens.h"
 #include "Screens/ImageViewScreen.h"
 #include "Screens/JobListScreen.h"
 #include "Screens/JobMeasureScreen.h"
 #include "Screens/LockScreen.h"
+#include "Screens/RestoreFactorySettingsPopup.h"
 #include "Screens/SadPuppyScreen.h"
 #include "Screens/SampleViewScreen.h"
 #include "Screens/SelfTestScreen.h"
@@ -181,6 +183,9 @@ QWidget* ScreenMaster::createScreen(SCREEN_ID_T id)
     case CALIBRATING_POPUP_SCREEN_ID:
     case CAL_IMMINENT_POPUP_SCREEN_ID:
     case CAL_NEEDED_POPUP_SCREEN_ID: return nullptr;
+    case CONFIG_MAIN_SCREEN_ID: return new ConfigMainScreen(this);
+    case RESTORE_FACTORY_SETTINGS_POPUP_SCREEN_ID: return new RestoreFactorySettingsPopup(this);
+    case DELETE_ALL_SAMPLES_POPUP_SCREEN_ID: return new DeleteAllSamplesPopup(this);
     default: return nullptr;
     }
 }
