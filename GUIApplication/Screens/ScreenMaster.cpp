@@ -7,6 +7,7 @@
 #include "Screens/LockScreen.h"
 #include "Screens/SadPuppyScreen.h"
 #include "Screens/SyncScreen.h"
+#include "Screens/TargetingScreen.h"
 #include "SharedSystem/LocaleHelper.h"
 #include "SharedSystem/Platform.h"
 #include "SharedSystem/StringTables.h"
@@ -144,6 +145,7 @@ QWidget* ScreenMaster::createScreen(SCREEN_ID_T id)
     case SYNC_SCREEN_ID: return new SyncScreen(this);
     case LOCK_SCREEN_ID: return new LockScreen(this);
     case SAD_PUPPY_POPUP_SCREEN_ID: return new SadPuppyScreen(this);
+    case TARGETING_SCREEN_ID: return new TargetingScreen(this);
     default: return nullptr;
     }
 }
