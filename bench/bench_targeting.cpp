@@ -21,6 +21,7 @@
 #include <QApplication>
 #include <QDir>
 #include <QElapsedTimer>
+#include <QEventLoop>
 #include <QProcess>
 #include <QTcpSocket>
 #include <QTimer>
@@ -56,12 +57,12 @@ double cpuSeconds()
         + usage.ru_stime.tv_usec / 1e6;
 }
 
+// Sleeps in the event loop, as the product does between ticks.
 void waitMs(int ms)
 {
-    QElapsedTimer clock;
-    clock.start();
-    while (clock.elapsed() < ms)
-        QCoreApplication::processEvents(QEventLoop::AllEvents, 20);
+    QEventLoop loop;
+    QTimer::singleShot(ms, &loop, &QEventLoop::quit);
+    loop.exec();
 }
 
 bool sendControl(quint16 port, const QByteArray& line)

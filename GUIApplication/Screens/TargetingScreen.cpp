@@ -964,9 +964,13 @@ void TargetingScreen::onShowSMCPopup()
         addNotification(tr("Warning"), tr("SMC force finished, all readings averaged for result."),
                         &TargetingScreen::onCloseSMCPopup);
     else
-        addNotification(tr("Information"),
-                        tr("Maximum number of SMC measurements used for this job").arg(job.getMaxSamples()),
-                        &TargetingScreen::onCloseSMCPopup);
+    {
+        // The English text names no figure; a translation may.
+        QString text = tr("Maximum number of SMC measurements used for this job");
+        if (text.contains(QLatin1String("%1")))
+            text = text.arg(job.getMaxSamples());
+        addNotification(tr("Information"), text, &TargetingScreen::onCloseSMCPopup);
+    }
 }
 
 void TargetingScreen::onShowLabModeJobCompletePopup()

@@ -85,6 +85,8 @@ private slots:
     void overrideMeasureAfterLiftStartsNothing();
     void pressRightAfterPopupCloseIsIgnored();
     void autoMeasureWaitsForReleaseThenMeasuresOnce();
+    void backDeletesTheJobMadeHere();
+    void leavingDropsTheOverride();
     void reticleColourAndTurn();
     void liveImageFollowsTheFeet();
     void simpleAverageOfSizeZeroShowsThreeNumbers();
@@ -414,6 +416,38 @@ void tst_Targeting::autoMeasureWaitsForReleaseThenMeasuresOnce()
     QTRY_VERIFY_WITH_TIMEOUT(s->isTargetingTimerActive(), 5000);
     QTest::qWait(2500);
     QCOMPARE(serverSamples(m_jobName), 1);
+}
+
+void tst_Targeting::backDeletesTheJobMadeHere()
+{
+    TargetingScreen* s = openJob(JOB_AVG_MODE_NONE, 3);
+    QVERIFY(s);
+    QPointer<TargetingScreen> guard(s);
+    QVERIFY(DataManager::instance()->getActiveJobObject().getCreatedOnInstrument());
+    QTest::mouseClick(s->findChild<QPushButton*>(QStringLiteral("BtnBack")), Qt::LeftButton);
+    DeletePopup* ask = topPopup<DeletePopup>();
+    QVERIFY(ask);
+    QCOMPARE(ask->findChild<QLabel*>(QStringLiteral("labelHeader"))->text(), QStringLiteral("Stop Measuring?"));
+    // The poll goes on behind the question.
+    QVERIFY(s->isTargetingTimerActive());
+    QTest::mouseClick(ask->findChild<QPushButton*>(QStringLiteral("BtnConfirm")), Qt::LeftButton);
+    QTRY_VERIFY_WITH_TIMEOUT(guard.isNull(), 3000);
+    QTRY_COMPARE_WITH_TIMEOUT(serverSamples(m_jobName), -1, 5000);
+    // No idle popup came up on the way out.
+    QCOMPARE(m_master->screenCount(), 1);
+}
+
+void tst_Targeting::leavingDropsTheOverride()
+{
+    UserParams::setDisplayOverridePressureSensorMenuItem(true);
+    UserParams::setOverridePressureSensors(true);
+    TargetingScreen* s = openJob(JOB_AVG_MODE_NONE, 3);
+    QVERIFY(s);
+    QVERIFY(UserParams::getOverridePressureSensors());
+    m_master->onGotoHomeScreen();
+    QTRY_VERIFY(m_master->findChild<TargetingScreen*>() == nullptr);
+    QVERIFY(!UserParams::getOverridePressureSensors());
+    UserParams::setDisplayOverridePressureSensorMenuItem(false);
 }
 
 void tst_Targeting::reticleColourAndTurn()
