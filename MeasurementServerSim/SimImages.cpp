@@ -144,9 +144,42 @@ namespace {
 // How far the view wanders from its centre, in pixels.
 const int kWanderX = 12;
 const int kWanderY = 10;
+
+// Marks on the panel that show which way the instrument is turned: a line
+// of masking tape below the spot and the fine scratches of a sanding pass
+// across it. The grain alone looks the same at every angle.
+void markSurface(QByteArray& tile, int side, double light)
+{
+    uchar* p = reinterpret_cast<uchar*>(tile.data());
+    const double c = side / 2.0;
+    const double tapeFrom = c + 64.0, tapeTo = c + 96.0;
+    for (int y = 0; y < side; ++y) {
+        const double dy = y - c;
+        for (int x = 0; x < side; ++x) {
+            const double dx = x - c;
+            uchar* px = p + (size_t(y) * side + x) * 3;
+            if (y >= tapeFrom && y < tapeTo) {
+                // Cream paper tape with a darker edge towards the spot.
+                const double edge = y < tapeFrom + 3 ? 0.55 : 1.0;
+                px[0] = clampByte(232.0 * light * edge);
+                px[1] = clampByte(214.0 * light * edge);
+                px[2] = clampByte(160.0 * light * edge);
+                continue;
+            }
+            // Scratches run at 30 degrees to the tape, a few pixels apart.
+            const double across = dx * 0.5 - dy * 0.8660254037844386;
+            const double phase = std::fmod(std::fabs(across), 17.0);
+            if (phase < 1.2) {
+                for (int k = 0; k < 3; ++k)
+                    px[k] = clampByte(px[k] * 1.10 + 6.0 * light);
+            }
+        }
+    }
+}
 } // namespace
 
-QByteArray LiveView::frame(const QString& panelSpec, int switchesDown, qint64 timeMs, int width, int height)
+QByteArray LiveView::frame(const QString& panelSpec, int switchesDown, qint64 timeMs, int width, int height,
+                           int rotationDegrees)
 {
     width = std::min(std::max(1, width), kMaxWidth);
     height = std::min(std::max(1, height), kMaxHeight);
@@ -167,19 +200,53 @@ QByteArray LiveView::frame(const QString& panelSpec, int switchesDown, qint64 ti
         c.light = switchesDown == 3 ? 1.0 : 0.12 + 0.18 * switchesDown;
         if (switchesDown < 3)
             c.sparkleIntensity *= 0.3;
-        m_tileWidth = width + 2 * kWanderX;
-        m_tileHeight = height + 2 * kWanderY;
+        // Square and wide enough for the view turned to any angle and
+        // wandering to its limits.
+        const int diagonal = int(std::ceil(std::sqrt(double(width) * width + double(height) * height)));
+        m_tileWidth = m_tileHeight = diagonal + 2 * std::max(kWanderX, kWanderY) + 4;
         m_tile = renderCoating(c, m_tileWidth, m_tileHeight, 0, 0);
+        markSurface(m_tile, m_tileWidth, c.light);
         m_key = key;
     }
     const double t = timeMs / 1000.0;
-    const int ox = kWanderX + int(std::lround(8.0 * std::sin(0.9 * t) + 3.0 * std::sin(3.7 * t)));
-    const int oy = kWanderY + int(std::lround(6.0 * std::cos(0.7 * t) + 3.0 * std::sin(4.3 * t)));
-    const int x0 = std::max(0, std::min(ox, m_tileWidth - width));
-    const int y0 = std::max(0, std::min(oy, m_tileHeight - height));
+    const double wanderX = 8.0 * std::sin(0.9 * t) + 3.0 * std::sin(3.7 * t);
+    const double wanderY = 6.0 * std::cos(0.7 * t) + 3.0 * std::sin(4.3 * t);
     QByteArray out(width * height * 3, Qt::Uninitialized);
-    for (int y = 0; y < height; ++y)
-        memcpy(out.data() + y * width * 3, m_tile.constData() + ((y0 + y) * m_tileWidth + x0) * 3, size_t(width) * 3);
+    uchar* dst = reinterpret_cast<uchar*>(out.data());
+    const uchar* src = reinterpret_cast<const uchar*>(m_tile.constData());
+
+    // The instrument turned clockwise sees the surface turned the other way.
+    const int degrees = ((rotationDegrees % 360) + 360) % 360;
+    const double rad = -degrees * M_PI / 180.0;
+    const double cosA = std::cos(rad), sinA = std::sin(rad);
+    const double centreX = m_tileWidth / 2.0 + wanderX, centreY = m_tileHeight / 2.0 + wanderY;
+    if (degrees == 0) {
+        const int x0 = std::max(0, std::min(int(std::lround(centreX - width / 2.0)), m_tileWidth - width));
+        const int y0 = std::max(0, std::min(int(std::lround(centreY - height / 2.0)), m_tileHeight - height));
+        for (int y = 0; y < height; ++y)
+            memcpy(dst + size_t(y) * width * 3, src + (size_t(y0 + y) * m_tileWidth + x0) * 3, size_t(width) * 3);
+        return out;
+    }
+    // Nearest pixel, walked in 16.16 fixed point along each row.
+    const qint64 one = 1 << 16;
+    const qint64 stepX = qint64(std::lround(cosA * one)), stepY = qint64(std::lround(sinA * one));
+    const qint64 maxX = qint64(m_tileWidth - 1) * one, maxY = qint64(m_tileHeight - 1) * one;
+    for (int y = 0; y < height; ++y) {
+        const double vy = y - height / 2.0;
+        const double vx = -width / 2.0;
+        qint64 sx = qint64(std::lround((centreX + vx * cosA - vy * sinA) * one));
+        qint64 sy = qint64(std::lround((centreY + vx * sinA + vy * cosA) * one));
+        uchar* row = dst + size_t(y) * width * 3;
+        for (int x = 0; x < width; ++x, sx += stepX, sy += stepY) {
+            const qint64 cx = std::max<qint64>(0, std::min(sx, maxX)) >> 16;
+            const qint64 cy = std::max<qint64>(0, std::min(sy, maxY)) >> 16;
+            const uchar* s = src + (size_t(cy) * m_tileWidth + size_t(cx)) * 3;
+            row[0] = s[0];
+            row[1] = s[1];
+            row[2] = s[2];
+            row += 3;
+        }
+    }
     return out;
 }
 

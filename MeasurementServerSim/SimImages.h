@@ -23,14 +23,16 @@ const int kMaxHeight = 348;
 QByteArray samplePicture(const Sample& sample, int imageAngle, int width, int height);
 
 // The live picture of the targeting view: the surface under the aperture,
-// lit when the instrument sits on it and dark when it is lifted. The time
-// moves the view a little, as a hand holding the instrument does. The
-// coating is rendered once per surface and light and then only cropped, so a
-// frame costs a copy.
+// lit when the instrument sits on it and dark when it is lifted, turned as
+// the instrument is turned (a tape line and sanding scratches on the panel
+// make the turn visible). The time moves the view a little, as a hand
+// holding the instrument does. The coating is rendered once per surface and
+// light and then only cropped and turned, so a frame costs about a copy.
 class LiveView
 {
 public:
-    QByteArray frame(const QString& panelSpec, int switchesDown, qint64 timeMs, int width, int height);
+    QByteArray frame(const QString& panelSpec, int switchesDown, qint64 timeMs, int width, int height,
+                     int rotationDegrees = 0);
 
 private:
     QString m_key;

@@ -710,7 +710,7 @@ QString Instrument::panelForView() const
 QByteArray Instrument::liveFrame(int width, int height)
 {
     m_lastTargetingPoll = m_uptime.elapsed();
-    return m_liveView.frame(panelForView(), switchesDown(), m_uptime.elapsed(), width, height);
+    return m_liveView.frame(panelForView(), switchesDown(), m_uptime.elapsed(), width, height, m_rotation);
 }
 
 STATUS_T Instrument::referenceCheck(const QString& reference, QDateTime* when, quint8* result) const

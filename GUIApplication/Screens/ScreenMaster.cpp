@@ -16,6 +16,7 @@
 #include "Screens/SampleViewScreen.h"
 #include "Screens/SelfTestScreen.h"
 #include "Screens/SyncScreen.h"
+#include "Screens/TargetingScreen.h"
 #include "SharedSystem/LocaleHelper.h"
 #include "SharedSystem/Platform.h"
 #include "SharedSystem/StringTables.h"
@@ -186,6 +187,7 @@ QWidget* ScreenMaster::createScreen(SCREEN_ID_T id)
     case CONFIG_MAIN_SCREEN_ID: return new ConfigMainScreen(this);
     case RESTORE_FACTORY_SETTINGS_POPUP_SCREEN_ID: return new RestoreFactorySettingsPopup(this);
     case DELETE_ALL_SAMPLES_POPUP_SCREEN_ID: return new DeleteAllSamplesPopup(this);
+    case TARGETING_SCREEN_ID: return new TargetingScreen(this);
     default: return nullptr;
     }
 }
