@@ -8,6 +8,7 @@
 #include "SharedSystem/Instrument.h"
 #include "SharedSystem/Job.h"
 #include "SharedSystem/LocaleHelper.h"
+#include "SharedSystem/StringTables.h"
 #include "Widgets/FlickButton.h"
 #include "Widgets/FlickList.h"
 #include "Widgets/KLabel.h"
@@ -201,6 +202,8 @@ void Runner::initTestCase()
     m_directory = QDir::cleanPath(QCoreApplication::applicationDirPath() + "/../screenshots");
     QVERIFY(QDir().mkpath(m_directory));
     QApplication::setFont(LocaleHelper::determineFontFromCountryCode("en"));
+    // As the program starts: the angle names that sample answers are read by.
+    StringTables::Init();
     DataManager::instance();
 }
 
