@@ -23,6 +23,7 @@
 #include <QDebug>
 #include <QEvent>
 #include <QKeyEvent>
+#include <QTimer>
 
 namespace {
 
@@ -78,7 +79,12 @@ JobMeasureScreen::JobMeasureScreen(QWidget* parent)
     connect(this, &JobMeasureScreen::syncJob, SyncObject::instance(), &SyncObject::onSyncJob);
     connect(data, &DataManager::updateWifiState, this, &JobMeasureScreen::onWifiStateChanged);
 
-    onUpdateScreen();
+    // Without a job the screen closes again, but only once it is on the
+    // stack: a close from inside the constructor would leave it there.
+    if (data->getActiveJobObject().isJobValid())
+        onUpdateScreen();
+    else
+        QTimer::singleShot(0, this, &JobMeasureScreen::onUpdateScreen);
 }
 
 JobMeasureScreen::~JobMeasureScreen()

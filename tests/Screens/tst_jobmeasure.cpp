@@ -583,6 +583,11 @@ void tst_JobMeasure::vanishedJobClosesTheScreen()
     QTRY_VERIFY(gone.isNull());
     data->setActiveJob(index);
     data->deleteActiveJob();
+
+    // Opened with no job at all, it leaves the stack again.
+    data->setActiveJob(NO_INDEX);
+    m_master->onAddScreenToStack(JOB_MEASURE_SCREEN_ID);
+    QTRY_COMPARE(m_master->screenCount(), 1);
 }
 
 QTEST_MAIN(tst_JobMeasure)
