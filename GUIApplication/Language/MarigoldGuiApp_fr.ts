@@ -160,6 +160,28 @@
     </message>
 </context>
 <context>
+    <name>DeleteSamplePopup</name>
+    <message>
+        <source>Delete Sample?</source>
+        <translation>Supprimer l'échantillon ?</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Supprimer</translation>
+    </message>
+    <message>
+        <source>No</source>
+        <translation>Non</translation>
+    </message>
+</context>
+<context>
+    <name>ImageViewScreen</name>
+    <message>
+        <source>Camera Images</source>
+        <translation>Images caméra</translation>
+    </message>
+</context>
+<context>
     <name>JobActionsPopup</name>
     <message>
         <source>Delete Job</source>
@@ -310,6 +332,56 @@
     <message>
         <source>OK</source>
         <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>SampleDetailsViewer</name>
+    <message>
+        <source>Color View</source>
+        <translation>Vue couleur</translation>
+    </message>
+</context>
+<context>
+    <name>SampleDetailsViewerD15</name>
+    <message>
+        <source>15%1 Series</source>
+        <translation>Série 15%1</translation>
+    </message>
+</context>
+<context>
+    <name>SampleDetailsViewerD45</name>
+    <message>
+        <source>45%1 Series</source>
+        <translation>Série 45%1</translation>
+    </message>
+</context>
+<context>
+    <name>SampleDetailsViewerTexture</name>
+    <message>
+        <source>15%1 Texture</source>
+        <translation>Texture 15%1</translation>
+    </message>
+</context>
+<context>
+    <name>SampleResultsPage</name>
+    <message>
+        <source>Measurement</source>
+        <translation>Mesure</translation>
+    </message>
+    <message>
+        <source>Camera Images</source>
+        <translation>Images caméra</translation>
+    </message>
+</context>
+<context>
+    <name>SampleViewScreen</name>
+    <message>
+        <source>Details</source>
+        <translation>Détails</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Supprimer</translation>
     </message>
 </context>
 <context>
