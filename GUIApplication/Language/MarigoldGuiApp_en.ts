@@ -160,6 +160,28 @@
     </message>
 </context>
 <context>
+    <name>DeleteSamplePopup</name>
+    <message>
+        <source>Delete Sample?</source>
+        <translation>Delete Sample?</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Delete</translation>
+    </message>
+    <message>
+        <source>No</source>
+        <translation>No</translation>
+    </message>
+</context>
+<context>
+    <name>ImageViewScreen</name>
+    <message>
+        <source>Camera Images</source>
+        <translation>Camera Images</translation>
+    </message>
+</context>
+<context>
     <name>JobActionsPopup</name>
     <message>
         <source>Delete Job</source>
@@ -392,10 +414,60 @@
     </message>
 </context>
 <context>
+    <name>SampleDetailsViewer</name>
+    <message>
+        <source>Color View</source>
+        <translation>Color View</translation>
+    </message>
+</context>
+<context>
+    <name>SampleDetailsViewerD15</name>
+    <message>
+        <source>15%1 Series</source>
+        <translation>15%1 Series</translation>
+    </message>
+</context>
+<context>
+    <name>SampleDetailsViewerD45</name>
+    <message>
+        <source>45%1 Series</source>
+        <translation>45%1 Series</translation>
+    </message>
+</context>
+<context>
+    <name>SampleDetailsViewerTexture</name>
+    <message>
+        <source>15%1 Texture</source>
+        <translation>15%1 Texture</translation>
+    </message>
+</context>
+<context>
     <name>SampleListSelectionItemComplete</name>
     <message>
         <source>More measurements are needed to complete this job</source>
         <translation>More measurements are needed to complete this job</translation>
+    </message>
+</context>
+<context>
+    <name>SampleResultsPage</name>
+    <message>
+        <source>Measurement</source>
+        <translation>Measurement</translation>
+    </message>
+    <message>
+        <source>Camera Images</source>
+        <translation>Camera Images</translation>
+    </message>
+</context>
+<context>
+    <name>SampleViewScreen</name>
+    <message>
+        <source>Details</source>
+        <translation>Details</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Delete</translation>
     </message>
 </context>
 <context>

@@ -160,6 +160,28 @@
     </message>
 </context>
 <context>
+    <name>DeleteSamplePopup</name>
+    <message>
+        <source>Delete Sample?</source>
+        <translation>¿Eliminar muestra?</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Eliminar</translation>
+    </message>
+    <message>
+        <source>No</source>
+        <translation>No</translation>
+    </message>
+</context>
+<context>
+    <name>ImageViewScreen</name>
+    <message>
+        <source>Camera Images</source>
+        <translation>Imágenes de cámara</translation>
+    </message>
+</context>
+<context>
     <name>JobActionsPopup</name>
     <message>
         <source>Delete Job</source>
@@ -392,10 +414,60 @@
     </message>
 </context>
 <context>
+    <name>SampleDetailsViewer</name>
+    <message>
+        <source>Color View</source>
+        <translation>Vista de color</translation>
+    </message>
+</context>
+<context>
+    <name>SampleDetailsViewerD15</name>
+    <message>
+        <source>15%1 Series</source>
+        <translation>Serie 15%1</translation>
+    </message>
+</context>
+<context>
+    <name>SampleDetailsViewerD45</name>
+    <message>
+        <source>45%1 Series</source>
+        <translation>Serie 45%1</translation>
+    </message>
+</context>
+<context>
+    <name>SampleDetailsViewerTexture</name>
+    <message>
+        <source>15%1 Texture</source>
+        <translation>Textura 15%1</translation>
+    </message>
+</context>
+<context>
     <name>SampleListSelectionItemComplete</name>
     <message>
         <source>More measurements are needed to complete this job</source>
         <translation>Se necesitan más mediciones para completar este trabajo</translation>
+    </message>
+</context>
+<context>
+    <name>SampleResultsPage</name>
+    <message>
+        <source>Measurement</source>
+        <translation>Medición</translation>
+    </message>
+    <message>
+        <source>Camera Images</source>
+        <translation>Imágenes de cámara</translation>
+    </message>
+</context>
+<context>
+    <name>SampleViewScreen</name>
+    <message>
+        <source>Details</source>
+        <translation>Detalles</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Eliminar</translation>
     </message>
 </context>
 <context>

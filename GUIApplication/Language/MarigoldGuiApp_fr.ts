@@ -33,7 +33,7 @@
     </message>
     <message>
         <source>The instrument was moved during a measurement</source>
-        <translation>L&apos;instrument a été déplacé pendant la mesure</translation>
+        <translation>L'instrument a été déplacé pendant la mesure</translation>
     </message>
     <message>
         <source>Index invalid</source>
@@ -41,7 +41,7 @@
     </message>
     <message>
         <source>Calibration Error</source>
-        <translation>Erreur d&apos;étalonnage</translation>
+        <translation>Erreur d'étalonnage</translation>
     </message>
     <message>
         <source>Instrument not on white tile, or internal white dirty</source>
@@ -49,7 +49,7 @@
     </message>
     <message>
         <source>Calibration data not valid</source>
-        <translation>Données d&apos;étalonnage non valides</translation>
+        <translation>Données d'étalonnage non valides</translation>
     </message>
     <message>
         <source>Not calibrated</source>
@@ -65,7 +65,7 @@
     </message>
     <message>
         <source>The measurement has been aborted by the user</source>
-        <translation>La mesure a été interrompue par l&apos;utilisateur</translation>
+        <translation>La mesure a été interrompue par l'utilisateur</translation>
     </message>
     <message>
         <source>Battery is low. Charge the battery</source>
@@ -73,11 +73,11 @@
     </message>
     <message>
         <source>Battery is empty. Instrument will shut down</source>
-        <translation>Batterie vide. L&apos;instrument va s&apos;éteindre</translation>
+        <translation>Batterie vide. L'instrument va s'éteindre</translation>
     </message>
     <message>
         <source>Error in shutter motor</source>
-        <translation>Erreur du moteur d&apos;obturateur</translation>
+        <translation>Erreur du moteur d'obturateur</translation>
     </message>
     <message>
         <source>No stored reference measurement</source>
@@ -85,11 +85,11 @@
     </message>
     <message>
         <source>Spectral integration time on white too long</source>
-        <translation>Temps d&apos;intégration spectrale sur le blanc trop long</translation>
+        <translation>Temps d'intégration spectrale sur le blanc trop long</translation>
     </message>
     <message>
         <source>Wavelength shift above absolute limit of 5 nm</source>
-        <translation>Décalage de longueur d&apos;onde au-delà de la limite de 5 nm</translation>
+        <translation>Décalage de longueur d'onde au-delà de la limite de 5 nm</translation>
     </message>
     <message>
         <source>Low Storage</source>
@@ -105,11 +105,11 @@
     </message>
     <message>
         <source>Sample temperature too high (IR Sensor)</source>
-        <translation>Température de l&apos;échantillon trop élevée (capteur IR)</translation>
+        <translation>Température de l'échantillon trop élevée (capteur IR)</translation>
     </message>
     <message>
         <source>Sample temperature too low (IR Sensor)</source>
-        <translation>Température de l&apos;échantillon trop basse (capteur IR)</translation>
+        <translation>Température de l'échantillon trop basse (capteur IR)</translation>
     </message>
     <message>
         <source>Battery level is too low for update</source>
@@ -121,11 +121,11 @@
     </message>
     <message>
         <source>Problem during initialization. Please reboot the device</source>
-        <translation>Problème lors de l&apos;initialisation. Redémarrez l&apos;appareil</translation>
+        <translation>Problème lors de l'initialisation. Redémarrez l'appareil</translation>
     </message>
     <message>
         <source>Hardware communication error. Please reboot the device</source>
-        <translation>Erreur de communication matérielle. Redémarrez l&apos;appareil</translation>
+        <translation>Erreur de communication matérielle. Redémarrez l'appareil</translation>
     </message>
     <message>
         <source>Error during measurement</source>
@@ -157,6 +157,28 @@
     <message>
         <source>No</source>
         <translation>Non</translation>
+    </message>
+</context>
+<context>
+    <name>DeleteSamplePopup</name>
+    <message>
+        <source>Delete Sample?</source>
+        <translation>Supprimer l'échantillon ?</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Supprimer</translation>
+    </message>
+    <message>
+        <source>No</source>
+        <translation>Non</translation>
+    </message>
+</context>
+<context>
+    <name>ImageViewScreen</name>
+    <message>
+        <source>Camera Images</source>
+        <translation>Images caméra</translation>
     </message>
 </context>
 <context>
@@ -245,7 +267,7 @@
     </message>
     <message>
         <source>A new job cannot be created until one or more existing jobs are removed from the instrument.</source>
-        <translation>Impossible de créer un travail tant qu&apos;un ou plusieurs travaux n&apos;ont pas été supprimés de l&apos;instrument.</translation>
+        <translation>Impossible de créer un travail tant qu'un ou plusieurs travaux n'ont pas été supprimés de l'instrument.</translation>
     </message>
     <message>
         <source>There is not enough memory to complete the requested Job. Please remove existing jobs to free up memory.</source>
@@ -320,7 +342,7 @@
     </message>
     <message>
         <source>This job was not created on the instrument. Are you sure you want to edit the job?</source>
-        <translation>Ce travail n&apos;a pas été créé sur l&apos;instrument. Voulez-vous vraiment le modifier ?</translation>
+        <translation>Ce travail n'a pas été créé sur l'instrument. Voulez-vous vraiment le modifier ?</translation>
     </message>
     <message>
         <source>Edit</source>
@@ -350,7 +372,7 @@
     </message>
     <message>
         <source>Do not touch or bump instrument</source>
-        <translation>Ne touchez pas et ne heurtez pas l&apos;instrument</translation>
+        <translation>Ne touchez pas et ne heurtez pas l'instrument</translation>
     </message>
     <message>
         <source>Calculating</source>
@@ -358,7 +380,7 @@
     </message>
     <message>
         <source>OK to move instrument</source>
-        <translation>Vous pouvez déplacer l&apos;instrument</translation>
+        <translation>Vous pouvez déplacer l'instrument</translation>
     </message>
 </context>
 <context>
@@ -384,7 +406,7 @@
     </message>
     <message>
         <source>An error has occurred, please reboot the instrument</source>
-        <translation>Une erreur s&apos;est produite. Redémarrez l&apos;instrument</translation>
+        <translation>Une erreur s'est produite. Redémarrez l'instrument</translation>
     </message>
     <message>
         <source>OK</source>
@@ -392,10 +414,60 @@
     </message>
 </context>
 <context>
+    <name>SampleDetailsViewer</name>
+    <message>
+        <source>Color View</source>
+        <translation>Vue couleur</translation>
+    </message>
+</context>
+<context>
+    <name>SampleDetailsViewerD15</name>
+    <message>
+        <source>15%1 Series</source>
+        <translation>Série 15%1</translation>
+    </message>
+</context>
+<context>
+    <name>SampleDetailsViewerD45</name>
+    <message>
+        <source>45%1 Series</source>
+        <translation>Série 45%1</translation>
+    </message>
+</context>
+<context>
+    <name>SampleDetailsViewerTexture</name>
+    <message>
+        <source>15%1 Texture</source>
+        <translation>Texture 15%1</translation>
+    </message>
+</context>
+<context>
     <name>SampleListSelectionItemComplete</name>
     <message>
         <source>More measurements are needed to complete this job</source>
-        <translation>D&apos;autres mesures sont nécessaires pour terminer ce travail</translation>
+        <translation>D'autres mesures sont nécessaires pour terminer ce travail</translation>
+    </message>
+</context>
+<context>
+    <name>SampleResultsPage</name>
+    <message>
+        <source>Measurement</source>
+        <translation>Mesure</translation>
+    </message>
+    <message>
+        <source>Camera Images</source>
+        <translation>Images caméra</translation>
+    </message>
+</context>
+<context>
+    <name>SampleViewScreen</name>
+    <message>
+        <source>Details</source>
+        <translation>Détails</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Supprimer</translation>
     </message>
 </context>
 <context>
@@ -655,7 +727,7 @@
     <name>UndoPopup</name>
     <message>
         <source>Undo</source>
-        <translation>Annuler l&apos;action</translation>
+        <translation>Annuler l'action</translation>
     </message>
     <message>
         <source>Back</source>

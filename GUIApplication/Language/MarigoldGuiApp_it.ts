@@ -65,7 +65,7 @@
     </message>
     <message>
         <source>The measurement has been aborted by the user</source>
-        <translation>La misurazione è stata interrotta dall&apos;utente</translation>
+        <translation>La misurazione è stata interrotta dall'utente</translation>
     </message>
     <message>
         <source>Battery is low. Charge the battery</source>
@@ -77,7 +77,7 @@
     </message>
     <message>
         <source>Error in shutter motor</source>
-        <translation>Errore del motore dell&apos;otturatore</translation>
+        <translation>Errore del motore dell'otturatore</translation>
     </message>
     <message>
         <source>No stored reference measurement</source>
@@ -89,7 +89,7 @@
     </message>
     <message>
         <source>Wavelength shift above absolute limit of 5 nm</source>
-        <translation>Spostamento di lunghezza d&apos;onda oltre il limite assoluto di 5 nm</translation>
+        <translation>Spostamento di lunghezza d'onda oltre il limite assoluto di 5 nm</translation>
     </message>
     <message>
         <source>Low Storage</source>
@@ -113,7 +113,7 @@
     </message>
     <message>
         <source>Battery level is too low for update</source>
-        <translation>Livello batteria troppo basso per l&apos;aggiornamento</translation>
+        <translation>Livello batteria troppo basso per l'aggiornamento</translation>
     </message>
     <message>
         <source>Date and time not set</source>
@@ -121,7 +121,7 @@
     </message>
     <message>
         <source>Problem during initialization. Please reboot the device</source>
-        <translation>Problema durante l&apos;inizializzazione. Riavviare il dispositivo</translation>
+        <translation>Problema durante l'inizializzazione. Riavviare il dispositivo</translation>
     </message>
     <message>
         <source>Hardware communication error. Please reboot the device</source>
@@ -157,6 +157,28 @@
     <message>
         <source>No</source>
         <translation>No</translation>
+    </message>
+</context>
+<context>
+    <name>DeleteSamplePopup</name>
+    <message>
+        <source>Delete Sample?</source>
+        <translation>Eliminare il campione?</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Elimina</translation>
+    </message>
+    <message>
+        <source>No</source>
+        <translation>No</translation>
+    </message>
+</context>
+<context>
+    <name>ImageViewScreen</name>
+    <message>
+        <source>Camera Images</source>
+        <translation>Immagini fotocamera</translation>
     </message>
 </context>
 <context>
@@ -225,7 +247,7 @@
     </message>
     <message>
         <source>The entire job and all samples will be permanently deleted.</source>
-        <translation>L&apos;intero lavoro e tutti i campioni verranno eliminati definitivamente.</translation>
+        <translation>L'intero lavoro e tutti i campioni verranno eliminati definitivamente.</translation>
     </message>
     <message>
         <source>Delete All Completed Jobs?</source>
@@ -312,7 +334,7 @@
     </message>
     <message>
         <source>The entire job and all samples will be permanently deleted.</source>
-        <translation>L&apos;intero lavoro e tutti i campioni verranno eliminati definitivamente.</translation>
+        <translation>L'intero lavoro e tutti i campioni verranno eliminati definitivamente.</translation>
     </message>
     <message>
         <source>Warning</source>
@@ -392,10 +414,60 @@
     </message>
 </context>
 <context>
+    <name>SampleDetailsViewer</name>
+    <message>
+        <source>Color View</source>
+        <translation>Vista colore</translation>
+    </message>
+</context>
+<context>
+    <name>SampleDetailsViewerD15</name>
+    <message>
+        <source>15%1 Series</source>
+        <translation>Serie 15%1</translation>
+    </message>
+</context>
+<context>
+    <name>SampleDetailsViewerD45</name>
+    <message>
+        <source>45%1 Series</source>
+        <translation>Serie 45%1</translation>
+    </message>
+</context>
+<context>
+    <name>SampleDetailsViewerTexture</name>
+    <message>
+        <source>15%1 Texture</source>
+        <translation>Texture 15%1</translation>
+    </message>
+</context>
+<context>
     <name>SampleListSelectionItemComplete</name>
     <message>
         <source>More measurements are needed to complete this job</source>
         <translation>Servono altre misurazioni per completare questo lavoro</translation>
+    </message>
+</context>
+<context>
+    <name>SampleResultsPage</name>
+    <message>
+        <source>Measurement</source>
+        <translation>Misurazione</translation>
+    </message>
+    <message>
+        <source>Camera Images</source>
+        <translation>Immagini fotocamera</translation>
+    </message>
+</context>
+<context>
+    <name>SampleViewScreen</name>
+    <message>
+        <source>Details</source>
+        <translation>Dettagli</translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation>Elimina</translation>
     </message>
 </context>
 <context>

@@ -154,7 +154,13 @@ void SampleDetailsPageContainerDNumber::drawButtons()
     SampleDetailsPageContainer::drawButtons();
     const Sample sample = DataManager::instance()->getActiveSampleObject();
     for (size_t i = 0; i < m_pageButtons.size() && i < m_buttonAngles.size(); ++i) {
-        const QRect b = m_pageButtons[i]->geometry();
+        // The blanks make room for the patch only in a font with narrow
+        // spaces; a padding of the patch's width does it in every language.
+        FlickButton* button = m_pageButtons[i];
+        button->setText(m_buttonStrings.at(int(i)).trimmed());
+        button->setStyleSheet(button->styleSheet()
+                              + QStringLiteral("QPushButton { padding-left: %1px; }").arg(kPatchWidth + 10));
+        const QRect b = button->geometry();
         auto* patch = new ColorPatch(this);
         patch->setObjectName(QStringLiteral("buttonPatch%1").arg(i));
         patch->setColor(sample.getColor(m_buttonAngles[i]));

@@ -317,7 +317,7 @@ private slots:
         QVector<TEXTURE_PARAMETER_T> parameters;
         QCOMPARE(CmdOut_GetAngleTextureParameters(IMAGE_45, QStringLiteral("Job 8"), 1, parameters), 0u);
         QCOMPARE(parameters.size(), 5);
-        QCOMPARE(parameters[0].name, QStringLiteral("Sparkle Area"));
+        QCOMPARE(parameters[0].name, QStringLiteral("SA"));
 
         QCOMPARE(CmdOut_GetRefinishSample(sample, QStringLiteral("Job 8"), 9), 1065u);
         QCOMPARE(CmdOut_GetRefinishSample(sample, QStringLiteral("Nope"), 1), 10u);
