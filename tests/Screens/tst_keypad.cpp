@@ -19,7 +19,9 @@
 #include "SharedSystem/UserParams.h"
 #include "SharedSystem/XMLParser.h"
 #include "Utils/AudioPlayer.h"
+#include "Widgets/Keypad.h"
 #include "Widgets/WordWrapButton.h"
+#include "Widgets/XPushButton.h"
 
 #include "AppShell.h"
 #include "SimServer.h"
@@ -92,6 +94,7 @@ private slots:
     void overlappingKeysFirstWins();
     void readSwitchNeverEntersTheField();
     void composedLanguageHandsKeysToTheComposer();
+    void fixedKeypadPagesAndSignals();
 
     // Name, free tag, notes
     void fullNameGreysTheKeys();
@@ -566,6 +569,54 @@ void tst_Keypad::composedLanguageHandsKeysToTheComposer()
     QTest::mouseClick(screen->btnEnter(), Qt::LeftButton);
     QCOMPARE(seen, (QStringList{"G", "G", "<del>", "<enter>"}));
     QCOMPARE(screen->text(), QString("G"));
+}
+
+void tst_Keypad::fixedKeypadPagesAndSignals()
+{
+    QWidget window;
+    window.resize(320, 480);
+    auto* pad = new Keypad(&window);
+    pad->move(0, 150);
+    window.show();
+    QSignalSpy keys(pad, &Keypad::keyClicked);
+    QSignalSpy deletes(pad, &Keypad::deleteClicked);
+
+    // Letters first: rows of 7, 6, 7 and 6, the short rows half a key in.
+    const auto& letters = pad->letters()->keyButtons();
+    QCOMPARE(letters.size(), 26);
+    QCOMPARE(letters[0]->geometry(), QRect(20, 33, 39, 47));
+    QCOMPARE(letters[7]->pos(), QPoint(39, 85));
+    QCOMPARE(letters[25]->text(), QString("Z"));
+    QCOMPARE(letters[25]->pos(), QPoint(239, 189));
+    QCOMPARE(pad->btnNumLetter()->text(), QString("123"));
+    QVERIFY(pad->letters()->isVisible() && !pad->numbers()->isVisible());
+
+    // The enlarged key stands over the held key, on the window.
+    QTest::mousePress(letters[2], Qt::LeftButton);
+    QLabel* shown = pad->letters()->notification();
+    QVERIFY(shown && shown->isVisible());
+    QCOMPARE(shown->parentWidget(), &window);
+    QCOMPARE(shown->text(), QString("C"));
+    QCOMPARE(shown->geometry().bottom() + 1, letters[2]->mapTo(&window, QPoint(0, 0)).y());
+    QTest::mouseRelease(letters[2], Qt::LeftButton);
+    QVERIFY(!pad->letters()->notification());
+    QCOMPARE(keys.takeFirst().at(0).toString(), QString("C"));
+
+    QTest::mouseClick(pad->btnNumLetter(), Qt::LeftButton);
+    QCOMPARE(pad->btnNumLetter()->text(), QString("ABC"));
+    QVERIFY(!pad->letters()->isVisible() && pad->numbers()->isVisible());
+    const auto& numbers = pad->numbers()->keyButtons();
+    QCOMPARE(numbers.size(), 10);
+    QCOMPARE(numbers[4]->geometry(), QRect(114, 85, 93, 47));
+    QCOMPARE(numbers[9]->text(), QString("0"));
+    QCOMPARE(numbers[9]->pos(), QPoint(114, 189));
+    QTest::mouseClick(numbers[9], Qt::LeftButton);
+    QTest::mouseClick(pad->btnSpace(), Qt::LeftButton);
+    QTest::mouseClick(pad->btnDelete(), Qt::LeftButton);
+    QCOMPARE(keys.size(), 2);
+    QCOMPARE(keys[0].at(0).toString(), QString("0"));
+    QCOMPARE(keys[1].at(0).toString(), QString(" "));
+    QCOMPARE(deletes.size(), 1);
 }
 
 // ---------------------------------------------------------------- name, free tag, notes
