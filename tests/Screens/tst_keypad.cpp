@@ -81,7 +81,6 @@ private slots:
     void init();
 
     // Layout files
-    void parserTakesKeysByTheirAttributes();
     void brokenLayoutFallsBackInBoundedTime();
     void shippedLayoutsAreRealKeyboards_data();
     void shippedLayoutsAreRealKeyboards();
@@ -246,38 +245,6 @@ NotificationPopup* tst_Keypad::popupOf(DaddyPanel* panel) const
 }
 
 // ---------------------------------------------------------------- layout files
-
-void tst_Keypad::parserTakesKeysByTheirAttributes()
-{
-    XMLParser parser(FILTER_SCHEMA_PATH, TRANSLATION_SCHEMA_PATH);
-    KeypadArray keys;
-    QCOMPARE(parser.parseKeypadXML(QByteArray(), keys), KEYPAD_XML_NO_KEYS);
-
-    // Any element with all six attributes is a key; five are not enough.
-    const QByteArray bytes = layout({
-        keyXml(65, 97, 10, 170),
-        "<key characterCap=\"66\" characterLow=\"98\" xCoord=\"36\" yCoord=\"170\" height=\"55\"/>",
-        "<button characterCap=\"67\" characterLow=\"0\" xCoord=\"62\" yCoord=\"170\" width=\"26\" "
-        "height=\"55\" special=\" true \"/>",
-        keyXml(68, 100, 88, 170, 26, 55, "special=\"yes\""),
-    });
-    QCOMPARE(parser.parseKeypadXML(bytes, keys), 0);
-    QCOMPARE(keys.size(), 3);
-    QCOMPARE(keys[0].characterCap, QChar('A'));
-    QCOMPARE(keys[0].characterLow, QChar('a'));
-    QCOMPARE(keys[0].geometry, QRect(10, 170, 26, 55));
-    QCOMPARE(keys[1].characterCap, QChar('C'));
-    QVERIFY(keys[1].characterLow.isNull());
-    QVERIFY(keys[1].special);
-    QVERIFY(!keys[2].special);
-
-    // A key without width alone makes no layout.
-    QCOMPARE(parser.parseKeypadXML(layout({"<key characterCap=\"66\" characterLow=\"98\" xCoord=\"36\" "
-                                           "yCoord=\"170\" height=\"55\"/>"}),
-                                   keys),
-             KEYPAD_XML_NO_KEYS);
-    QVERIFY(keys.isEmpty());
-}
 
 void tst_Keypad::brokenLayoutFallsBackInBoundedTime()
 {
