@@ -315,6 +315,10 @@ void JobKeypadScreen::on_BtnBack_clicked()
 void JobKeypadScreen::on_BtnNext_clicked()
 {
     playSoundButtonClick();
+    // A second tap queued behind the first would store twice or stack a
+    // second refusal over the first.
+    if (isClosing() || !popups().empty())
+        return;
     onNextAction();
 }
 

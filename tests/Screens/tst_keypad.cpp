@@ -638,6 +638,9 @@ void tst_Keypad::nameRules()
     QVERIFY(popup);
     QCOMPARE(popup->headerText(), QString("Job Name cannot be empty"));
     QVERIFY(!screen->isClosing());
+    // A second tap behind the first doesn't stack another refusal.
+    screen->on_BtnNext_clicked();
+    QCOMPARE(int(screen->popups().size()), 1);
     screen->onClosePopup(popup);
 
     // Another job's name shows red and is refused.
