@@ -308,6 +308,8 @@ void JobTagEditScreen::textEditChanged()
     }
     if (count >= 3)
         m_pBtnMore->show();
+    // Too many to list: the button stays, greyed, and leads nowhere.
+    m_pBtnMore->setEnabled(count <= kMaxListed);
     // A list left open over the keys would outlive its button.
     if (isListOpen() && !m_pBtnMore->isVisible()) {
         clearAutoFillPopup();

@@ -5,7 +5,6 @@
 #include "SharedSystem/Job.h"
 #include "SharedSystem/UserParams.h"
 
-#include <QDebug>
 #include <QEvent>
 #include <QFontMetricsF>
 #include <QKeyEvent>
