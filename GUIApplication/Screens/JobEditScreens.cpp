@@ -26,7 +26,7 @@ const char* const kMoreStyle =
     "QPushButton { border: 2px solid rgb(0, 174, 239); border-radius: 18px; color: rgb(0, 174, 239);"
     " background-color: rgb(255, 255, 255); margin: 2px 0px 2px 0px; }"
     "QPushButton[selected=\"true\"] { color: rgb(255, 255, 255); background-color: rgb(0, 174, 239); }"
-    "QPushButton:disabled { color: rgb(190, 190, 190); }";
+    "QPushButton:disabled { color: rgb(190, 190, 190); border-color: rgb(190, 190, 190); }";
 
 const int kQuickWidth = 120;
 const int kQuickHeight = 40;
@@ -308,6 +308,8 @@ void JobTagEditScreen::textEditChanged()
     }
     if (count >= 3)
         m_pBtnMore->show();
+    // Too many to list: the button stays, greyed, and leads nowhere.
+    m_pBtnMore->setEnabled(count <= kMaxListed);
     // A list left open over the keys would outlive its button.
     if (isListOpen() && !m_pBtnMore->isVisible()) {
         clearAutoFillPopup();

@@ -5,7 +5,6 @@
 #include "SharedSystem/Job.h"
 #include "SharedSystem/UserParams.h"
 
-#include <QDebug>
 #include <QEvent>
 #include <QFontMetricsF>
 #include <QKeyEvent>
@@ -315,6 +314,10 @@ void JobKeypadScreen::on_BtnBack_clicked()
 void JobKeypadScreen::on_BtnNext_clicked()
 {
     playSoundButtonClick();
+    // A second tap queued behind the first would store twice or stack a
+    // second refusal over the first.
+    if (isClosing() || !popups().empty())
+        return;
     onNextAction();
 }
 

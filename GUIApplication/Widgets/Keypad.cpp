@@ -28,6 +28,11 @@ KeypadPage::KeypadPage(QWidget* parent)
     resize(320, 236);
 }
 
+KeypadPage::~KeypadPage()
+{
+    delete m_notificationPopup;
+}
+
 void KeypadPage::removeKeys()
 {
     qDeleteAll(m_keys);

@@ -6,6 +6,7 @@
 // screens that want a short entry (a number, a code) without the full
 // keypad screen.
 
+#include <QPointer>
 #include <QString>
 #include <QVector>
 #include <QWidget>
@@ -21,6 +22,7 @@ class KeypadPage : public QWidget
     Q_OBJECT
 public:
     explicit KeypadPage(QWidget* parent = nullptr);
+    ~KeypadPage() override;
 
     const QVector<XPushButton*>& keyButtons() const { return m_keys; }
     QLabel* notification() const { return m_notificationPopup; }
@@ -50,7 +52,8 @@ protected:
     QSignalMapper* m_clickedMapper = nullptr;
     QSignalMapper* m_pressedMapper = nullptr;
     QSignalMapper* m_releasedMapper = nullptr;
-    QLabel* m_notificationPopup = nullptr;
+    // Lives on the window, not on the page; the window may go first.
+    QPointer<QLabel> m_notificationPopup;
 };
 
 class KeypadNumbers : public KeypadPage

@@ -19,7 +19,9 @@
 #include "SharedSystem/UserParams.h"
 #include "SharedSystem/XMLParser.h"
 #include "Utils/AudioPlayer.h"
+#include "Widgets/Keypad.h"
 #include "Widgets/WordWrapButton.h"
+#include "Widgets/XPushButton.h"
 
 #include "AppShell.h"
 #include "SimServer.h"
@@ -79,7 +81,6 @@ private slots:
     void init();
 
     // Layout files
-    void parserTakesKeysByTheirAttributes();
     void brokenLayoutFallsBackInBoundedTime();
     void shippedLayoutsAreRealKeyboards_data();
     void shippedLayoutsAreRealKeyboards();
@@ -92,6 +93,7 @@ private slots:
     void overlappingKeysFirstWins();
     void readSwitchNeverEntersTheField();
     void composedLanguageHandsKeysToTheComposer();
+    void fixedKeypadPagesAndSignals();
 
     // Name, free tag, notes
     void fullNameGreysTheKeys();
@@ -243,38 +245,6 @@ NotificationPopup* tst_Keypad::popupOf(DaddyPanel* panel) const
 }
 
 // ---------------------------------------------------------------- layout files
-
-void tst_Keypad::parserTakesKeysByTheirAttributes()
-{
-    XMLParser parser(FILTER_SCHEMA_PATH, TRANSLATION_SCHEMA_PATH);
-    KeypadArray keys;
-    QCOMPARE(parser.parseKeypadXML(QByteArray(), keys), KEYPAD_XML_NO_KEYS);
-
-    // Any element with all six attributes is a key; five are not enough.
-    const QByteArray bytes = layout({
-        keyXml(65, 97, 10, 170),
-        "<key characterCap=\"66\" characterLow=\"98\" xCoord=\"36\" yCoord=\"170\" height=\"55\"/>",
-        "<button characterCap=\"67\" characterLow=\"0\" xCoord=\"62\" yCoord=\"170\" width=\"26\" "
-        "height=\"55\" special=\" true \"/>",
-        keyXml(68, 100, 88, 170, 26, 55, "special=\"yes\""),
-    });
-    QCOMPARE(parser.parseKeypadXML(bytes, keys), 0);
-    QCOMPARE(keys.size(), 3);
-    QCOMPARE(keys[0].characterCap, QChar('A'));
-    QCOMPARE(keys[0].characterLow, QChar('a'));
-    QCOMPARE(keys[0].geometry, QRect(10, 170, 26, 55));
-    QCOMPARE(keys[1].characterCap, QChar('C'));
-    QVERIFY(keys[1].characterLow.isNull());
-    QVERIFY(keys[1].special);
-    QVERIFY(!keys[2].special);
-
-    // A key without width alone makes no layout.
-    QCOMPARE(parser.parseKeypadXML(layout({"<key characterCap=\"66\" characterLow=\"98\" xCoord=\"36\" "
-                                           "yCoord=\"170\" height=\"55\"/>"}),
-                                   keys),
-             KEYPAD_XML_NO_KEYS);
-    QVERIFY(keys.isEmpty());
-}
 
 void tst_Keypad::brokenLayoutFallsBackInBoundedTime()
 {
@@ -568,6 +538,54 @@ void tst_Keypad::composedLanguageHandsKeysToTheComposer()
     QCOMPARE(screen->text(), QString("G"));
 }
 
+void tst_Keypad::fixedKeypadPagesAndSignals()
+{
+    QWidget window;
+    window.resize(320, 480);
+    auto* pad = new Keypad(&window);
+    pad->move(0, 150);
+    window.show();
+    QSignalSpy keys(pad, &Keypad::keyClicked);
+    QSignalSpy deletes(pad, &Keypad::deleteClicked);
+
+    // Letters first: rows of 7, 6, 7 and 6, the short rows half a key in.
+    const auto& letters = pad->letters()->keyButtons();
+    QCOMPARE(letters.size(), 26);
+    QCOMPARE(letters[0]->geometry(), QRect(20, 33, 39, 47));
+    QCOMPARE(letters[7]->pos(), QPoint(39, 85));
+    QCOMPARE(letters[25]->text(), QString("Z"));
+    QCOMPARE(letters[25]->pos(), QPoint(239, 189));
+    QCOMPARE(pad->btnNumLetter()->text(), QString("123"));
+    QVERIFY(pad->letters()->isVisible() && !pad->numbers()->isVisible());
+
+    // The enlarged key stands over the held key, on the window.
+    QTest::mousePress(letters[2], Qt::LeftButton);
+    QLabel* shown = pad->letters()->notification();
+    QVERIFY(shown && shown->isVisible());
+    QCOMPARE(shown->parentWidget(), &window);
+    QCOMPARE(shown->text(), QString("C"));
+    QCOMPARE(shown->geometry().bottom() + 1, letters[2]->mapTo(&window, QPoint(0, 0)).y());
+    QTest::mouseRelease(letters[2], Qt::LeftButton);
+    QVERIFY(!pad->letters()->notification());
+    QCOMPARE(keys.takeFirst().at(0).toString(), QString("C"));
+
+    QTest::mouseClick(pad->btnNumLetter(), Qt::LeftButton);
+    QCOMPARE(pad->btnNumLetter()->text(), QString("ABC"));
+    QVERIFY(!pad->letters()->isVisible() && pad->numbers()->isVisible());
+    const auto& numbers = pad->numbers()->keyButtons();
+    QCOMPARE(numbers.size(), 10);
+    QCOMPARE(numbers[4]->geometry(), QRect(114, 85, 93, 47));
+    QCOMPARE(numbers[9]->text(), QString("0"));
+    QCOMPARE(numbers[9]->pos(), QPoint(114, 189));
+    QTest::mouseClick(numbers[9], Qt::LeftButton);
+    QTest::mouseClick(pad->btnSpace(), Qt::LeftButton);
+    QTest::mouseClick(pad->btnDelete(), Qt::LeftButton);
+    QCOMPARE(keys.size(), 2);
+    QCOMPARE(keys[0].at(0).toString(), QString("0"));
+    QCOMPARE(keys[1].at(0).toString(), QString(" "));
+    QCOMPARE(deletes.size(), 1);
+}
+
 // ---------------------------------------------------------------- name, free tag, notes
 
 void tst_Keypad::fullNameGreysTheKeys()
@@ -620,6 +638,9 @@ void tst_Keypad::nameRules()
     QVERIFY(popup);
     QCOMPARE(popup->headerText(), QString("Job Name cannot be empty"));
     QVERIFY(!screen->isClosing());
+    // A second tap behind the first doesn't stack another refusal.
+    screen->on_BtnNext_clicked();
+    QCOMPARE(int(screen->popups().size()), 1);
     screen->onClosePopup(popup);
 
     // Another job's name shows red and is refused.
@@ -765,7 +786,8 @@ void tst_Keypad::tooManyMatchesLeaveMoreDead()
     QVERIFY(screen);
     QVERIFY(screen->matches().size() >= 15);
     QVERIFY(screen->btnMore()->isVisible());
-    QTest::mouseClick(screen->btnMore(), Qt::LeftButton);
+    QVERIFY(!screen->btnMore()->isEnabled());
+    screen->onBtnMoreClicked();
     QVERIFY(!screen->isListOpen());
     QVERIFY(screen->autoFillButtons().isEmpty());
 }

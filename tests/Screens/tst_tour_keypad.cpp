@@ -138,6 +138,7 @@ QList<Tour::Stop> stops()
         {"keypad_tag_make_list", [](QWidget* d) { tagScreen(d, TAG_STATE_1, "")->onBtnMoreClicked(); }},
         {"keypad_tag_make_one_match", [](QWidget* d) { tagScreen(d, TAG_STATE_1, "Vo"); }},
         {"keypad_tag_model_typing", [](QWidget* d) { tagScreen(d, TAG_STATE_2, "F"); }},
+        {"keypad_tag_colour_too_many", [](QWidget* d) { tagScreen(d, TAG_STATE_3, ""); }},
         {"keypad_tag_colour_typing", [](QWidget* d) { tagScreen(d, TAG_STATE_3, "Z1"); }},
         {"keypad_tag_no_match", [](QWidget* d) { tagScreen(d, TAG_STATE_1, "Fx"); }},
         {"keypad_tag_unknown_popup", [](QWidget* d) { tagScreen(d, TAG_STATE_1, "Fordson")->onNextAction(); }},
