@@ -651,6 +651,9 @@ void TargetingScreen::onTriggerTargetingStart()
 void TargetingScreen::onTriggerTargetingStop()
 {
     m_TargetingTimer.stop();
+    // Without the poll the feet are unknown: a press behind the popups that
+    // follow a stop must not measure on the last reading.
+    m_pressureSwitch = PRESSURE_SWITCH_T();
     CmdOut_StopTargetingMode();
 }
 

@@ -80,6 +80,7 @@ private slots:
     void init();
     void cleanup();
 
+    void jobListStartReachesTargeting();
     void pressWithNoFootIsUsedUpFor2s();
     void partFeetWithoutOverrideInforms();
     void overrideMeasureAfterLiftStartsNothing();
@@ -261,6 +262,24 @@ void tst_Targeting::measureOnce()
     QTRY_COMPARE_WITH_TIMEOUT(localSamples(), before + 1, 8000);
 }
 
+void tst_Targeting::jobListStartReachesTargeting()
+{
+    DataManager* data = DataManager::instance();
+    Job job;
+    job.clearContents();
+    m_jobName = QStringLiteral("T%1").arg(++m_jobCounter);
+    job.setName(m_jobName);
+    job.setJobAveragingMode(JOB_AVG_MODE_NONE);
+    job.setJobSize(3);
+    const unsigned index = data->addJob(job);
+    QVERIFY(index != NO_INDEX);
+    data->setActiveJob(index);
+    m_master->findChild<JobListScreen*>()->onStartJob();
+    QTRY_VERIFY_WITH_TIMEOUT(screen() != nullptr, 5000);
+    QTRY_VERIFY_WITH_TIMEOUT(screen()->isTargetingTimerActive() && screen()->framesShown() > 0, 5000);
+    QVERIFY(requestedScreens().isEmpty());
+}
+
 void tst_Targeting::pressWithNoFootIsUsedUpFor2s()
 {
     TargetingScreen* s = openJob(JOB_AVG_MODE_NONE, 3);
@@ -367,6 +386,12 @@ void tst_Targeting::pressRightAfterPopupCloseIsIgnored()
     QCOMPARE(idle, s->idlePopup());
     QCOMPARE(idle->headerText(), QStringLiteral("Continue Measuring?"));
     QVERIFY(!s->isTargetingTimerActive());
+
+    // Behind the popup the last reading no longer counts.
+    press();
+    QTest::qWait(500);
+    QCOMPARE(serverSamples(m_jobName), 0);
+    QTRY_VERIFY_WITH_TIMEOUT(s->isDebounced(), 3000);
 
     QTest::mouseClick(idle->findChild<QPushButton*>(QStringLiteral("Btn")), Qt::LeftButton);
     QVERIFY(s->popups().empty());
