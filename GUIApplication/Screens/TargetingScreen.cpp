@@ -961,19 +961,20 @@ void TargetingScreen::onShowMeasuringPopup()
 void TargetingScreen::onShowSMCPopup()
 {
     hideAutoMeasureIcon();
+    if (m_smcEndPopup)
+        return;
     const Job job = DataManager::instance()->getActiveJobObject();
     const int state = job.getJobState();
-    if (state == kJobStateSmcForced || state == kJobStateSmcForcedOnline)
-        addNotification(tr("Warning"), tr("SMC force finished, all readings averaged for result."),
-                        &TargetingScreen::onCloseSMCPopup);
-    else
-    {
-        // The English text names no figure; a translation may.
-        QString text = tr("Maximum number of SMC measurements used for this job");
-        if (text.contains(QLatin1String("%1")))
-            text = text.arg(job.getMaxSamples());
-        addNotification(tr("Information"), text, &TargetingScreen::onCloseSMCPopup);
+    if (state == kJobStateSmcForced || state == kJobStateSmcForcedOnline) {
+        m_smcEndPopup = addNotification(tr("Warning"), tr("SMC force finished, all readings averaged for result."),
+                                        &TargetingScreen::onCloseSMCPopup);
+        return;
     }
+    // The English text names no figure; a translation may.
+    QString text = tr("Maximum number of SMC measurements used for this job");
+    if (text.contains(QLatin1String("%1")))
+        text = text.arg(job.getMaxSamples());
+    m_smcEndPopup = addNotification(tr("Information"), text, &TargetingScreen::onCloseSMCPopup);
 }
 
 void TargetingScreen::onShowLabModeJobCompletePopup()
@@ -986,18 +987,20 @@ void TargetingScreen::onShowLabModeJobCompletePopup()
 void TargetingScreen::onShowLabModeSMCJobCompletePopup()
 {
     hideAutoMeasureIcon();
+    if (m_smcEndPopup)
+        return;
     const Job job = DataManager::instance()->getActiveJobObject();
     const int state = job.getJobState();
     if (state == kJobStateSmcForced || state == kJobStateSmcForcedOnline)
-        addNotification(tr("Warning"),
-                        tr("SMC force finished, all readings averaged for result.  Press OK to exit online mode"),
-                        &TargetingScreen::onCloseLabModeJobCompletePopup);
+        m_smcEndPopup = addNotification(
+            tr("Warning"), tr("SMC force finished, all readings averaged for result.  Press OK to exit online mode"),
+            &TargetingScreen::onCloseLabModeJobCompletePopup);
     else
-        addNotification(tr("Warning"),
-                        tr("SMC failed after maximum measurements %1, the final results are averaged.  Press OK "
-                           "to exit online mode")
-                            .arg(job.getMaxSamples()),
-                        &TargetingScreen::onCloseLabModeJobCompletePopup);
+        m_smcEndPopup = addNotification(tr("Warning"),
+                                        tr("SMC failed after maximum measurements %1, the final results are "
+                                           "averaged.  Press OK to exit online mode")
+                                            .arg(job.getMaxSamples()),
+                                        &TargetingScreen::onCloseLabModeJobCompletePopup);
 }
 
 void TargetingScreen::onShowTerminatePopup()
