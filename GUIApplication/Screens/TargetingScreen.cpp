@@ -621,7 +621,9 @@ void TargetingScreen::onTriggerTargetingStart()
     QMutexLocker locker(&lock_);
     m_pressureSwitch = PRESSURE_SWITCH_T();
     if (CmdOut_StartTargetingMode() == kStatusNotReady) {
-        // Busy with something else: wait for it to finish, or give up.
+        // Busy with something else: wait for it to finish, or give up. The
+        // poll has nothing to ask a busy instrument meanwhile.
+        m_TargetingTimer.stop();
         QElapsedTimer waited;
         waited.start();
         bool ready = false;

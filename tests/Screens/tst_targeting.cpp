@@ -573,6 +573,22 @@ void tst_Targeting::smcTerminateFromTheThirdSample()
     QTest::mouseClick(s->popups().back()->findChild<QPushButton*>(QStringLiteral("BtnCancel")), Qt::LeftButton);
     QVERIFY(s->popups().empty());
     QTRY_VERIFY_WITH_TIMEOUT(s->isTargetingTimerActive(), 3000);
+
+    // Store Average force-finishes the job: one notice, and OK ends it.
+    QPointer<TargetingScreen> guard(s);
+    QTest::mouseClick(done, Qt::LeftButton);
+    QTest::mouseClick(s->popups().back()->findChild<QPushButton*>(QStringLiteral("BtnStoreAverage")),
+                      Qt::LeftButton);
+    QTRY_VERIFY_WITH_TIMEOUT(topPopup<NotificationPopup>() != nullptr, 5000);
+    QTest::qWait(500);
+    QCOMPARE(int(s->popups().size()), 1);
+    NotificationPopup* notice = topPopup<NotificationPopup>();
+    QCOMPARE(notice->headerText(), QStringLiteral("Warning"));
+    QCOMPARE(notice->messageText(), QStringLiteral("SMC force finished, all readings averaged for result."));
+    QVERIFY(control(QStringLiteral("jobs")).contains(QStringLiteral("\"%1\"  LOCAL").arg(m_jobName)));
+    QTest::mouseClick(notice->findChild<QPushButton*>(QStringLiteral("Btn")), Qt::LeftButton);
+    QTRY_VERIFY_WITH_TIMEOUT(requestedScreens().contains(JOB_MEASURE_SCREEN_ID), 5000);
+    QTRY_VERIFY_WITH_TIMEOUT(guard.isNull(), 3000);
 }
 
 void tst_Targeting::lastSampleEndsTheJob()
