@@ -273,6 +273,9 @@ void TargetingScreen::onUpdateTargettingScreen()
 
 void TargetingScreen::finishCompleteJob(bool labMode)
 {
+    // Not yet on the stack: the init step, 300 ms on, ends the job.
+    if (m_constructing)
+        return;
     playSoundJobComplete();
     TargetingAPI_StopPolling();
     DelayBlocking(1000);
@@ -290,6 +293,9 @@ void TargetingScreen::onUpdateSampleInfo()
     const bool labMode = UserParams::getLabModeEnabled();
     const Job job = data->getActiveJobObject();
     if (!job.isJobValid() && !labMode) {
+        // Not yet on the stack: the init step, 300 ms on, leaves.
+        if (m_constructing)
+            return;
         TargetingAPI_StopPolling();
         // A model emptied by a lost link is the fault screen's business:
         // going home now would take that screen away again.

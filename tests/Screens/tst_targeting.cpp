@@ -93,6 +93,7 @@ private slots:
     void simpleAverageOfSizeZeroShowsThreeNumbers();
     void smcTerminateFromTheThirdSample();
     void lastSampleEndsTheJob();
+    void completeJobOpenedLeavesAtInit();
     void jobTimeLimitClosesAndKeepsTheJob();
     void hotSampleWarnsOnce();
     void onlineModeLooksAndLeaves();
@@ -616,6 +617,22 @@ void tst_Targeting::lastSampleEndsTheJob()
     QTRY_VERIFY_WITH_TIMEOUT(guard.isNull(), 3000);
     QCOMPARE(m_master->currentScreen()->objectName(), QStringLiteral("StandIn%1").arg(int(JOB_MEASURE_SCREEN_ID)));
     QCOMPARE(serverSamples(m_jobName), 2);
+}
+
+void tst_Targeting::completeJobOpenedLeavesAtInit()
+{
+    // A job already complete when the screen is built: the screen first
+    // stands, then leaves for the summary from its init step.
+    DataManager* data = DataManager::instance();
+    data->setActiveJob(data->findJobByName(QStringLiteral("Job 1")));
+    QVERIFY(data->getActiveJobObject().isJobComplete());
+    m_master->onAddScreenToStack(TARGETING_SCREEN_ID);
+    QPointer<TargetingScreen> guard(screen());
+    QVERIFY(guard);
+    QTRY_VERIFY_WITH_TIMEOUT(requestedScreens().contains(JOB_MEASURE_SCREEN_ID), 5000);
+    QTRY_VERIFY_WITH_TIMEOUT(guard.isNull(), 3000);
+    QCOMPARE(m_master->screenCount(), 2);
+    QCOMPARE(m_master->currentScreen()->objectName(), QStringLiteral("StandIn%1").arg(int(JOB_MEASURE_SCREEN_ID)));
 }
 
 void tst_Targeting::jobTimeLimitClosesAndKeepsTheJob()
