@@ -273,6 +273,9 @@ void TargetingScreen::onUpdateTargettingScreen()
 
 void TargetingScreen::finishCompleteJob(bool labMode)
 {
+    // Not yet on the stack: the init step, 300 ms on, ends the job.
+    if (m_constructing)
+        return;
     playSoundJobComplete();
     TargetingAPI_StopPolling();
     DelayBlocking(1000);
@@ -290,6 +293,9 @@ void TargetingScreen::onUpdateSampleInfo()
     const bool labMode = UserParams::getLabModeEnabled();
     const Job job = data->getActiveJobObject();
     if (!job.isJobValid() && !labMode) {
+        // Not yet on the stack: the init step, 300 ms on, leaves.
+        if (m_constructing)
+            return;
         TargetingAPI_StopPolling();
         // A model emptied by a lost link is the fault screen's business:
         // going home now would take that screen away again.
@@ -621,7 +627,9 @@ void TargetingScreen::onTriggerTargetingStart()
     QMutexLocker locker(&lock_);
     m_pressureSwitch = PRESSURE_SWITCH_T();
     if (CmdOut_StartTargetingMode() == kStatusNotReady) {
-        // Busy with something else: wait for it to finish, or give up.
+        // Busy with something else: wait for it to finish, or give up. The
+        // poll has nothing to ask a busy instrument meanwhile.
+        m_TargetingTimer.stop();
         QElapsedTimer waited;
         waited.start();
         bool ready = false;
@@ -651,6 +659,9 @@ void TargetingScreen::onTriggerTargetingStart()
 void TargetingScreen::onTriggerTargetingStop()
 {
     m_TargetingTimer.stop();
+    // Without the poll the feet are unknown: a press behind the popups that
+    // follow a stop must not measure on the last reading.
+    m_pressureSwitch = PRESSURE_SWITCH_T();
     CmdOut_StopTargetingMode();
 }
 
@@ -958,19 +969,20 @@ void TargetingScreen::onShowMeasuringPopup()
 void TargetingScreen::onShowSMCPopup()
 {
     hideAutoMeasureIcon();
+    if (m_smcEndPopup)
+        return;
     const Job job = DataManager::instance()->getActiveJobObject();
     const int state = job.getJobState();
-    if (state == kJobStateSmcForced || state == kJobStateSmcForcedOnline)
-        addNotification(tr("Warning"), tr("SMC force finished, all readings averaged for result."),
-                        &TargetingScreen::onCloseSMCPopup);
-    else
-    {
-        // The English text names no figure; a translation may.
-        QString text = tr("Maximum number of SMC measurements used for this job");
-        if (text.contains(QLatin1String("%1")))
-            text = text.arg(job.getMaxSamples());
-        addNotification(tr("Information"), text, &TargetingScreen::onCloseSMCPopup);
+    if (state == kJobStateSmcForced || state == kJobStateSmcForcedOnline) {
+        m_smcEndPopup = addNotification(tr("Warning"), tr("SMC force finished, all readings averaged for result."),
+                                        &TargetingScreen::onCloseSMCPopup);
+        return;
     }
+    // The English text names no figure; a translation may.
+    QString text = tr("Maximum number of SMC measurements used for this job");
+    if (text.contains(QLatin1String("%1")))
+        text = text.arg(job.getMaxSamples());
+    m_smcEndPopup = addNotification(tr("Information"), text, &TargetingScreen::onCloseSMCPopup);
 }
 
 void TargetingScreen::onShowLabModeJobCompletePopup()
@@ -983,18 +995,20 @@ void TargetingScreen::onShowLabModeJobCompletePopup()
 void TargetingScreen::onShowLabModeSMCJobCompletePopup()
 {
     hideAutoMeasureIcon();
+    if (m_smcEndPopup)
+        return;
     const Job job = DataManager::instance()->getActiveJobObject();
     const int state = job.getJobState();
     if (state == kJobStateSmcForced || state == kJobStateSmcForcedOnline)
-        addNotification(tr("Warning"),
-                        tr("SMC force finished, all readings averaged for result.  Press OK to exit online mode"),
-                        &TargetingScreen::onCloseLabModeJobCompletePopup);
+        m_smcEndPopup = addNotification(
+            tr("Warning"), tr("SMC force finished, all readings averaged for result.  Press OK to exit online mode"),
+            &TargetingScreen::onCloseLabModeJobCompletePopup);
     else
-        addNotification(tr("Warning"),
-                        tr("SMC failed after maximum measurements %1, the final results are averaged.  Press OK "
-                           "to exit online mode")
-                            .arg(job.getMaxSamples()),
-                        &TargetingScreen::onCloseLabModeJobCompletePopup);
+        m_smcEndPopup = addNotification(tr("Warning"),
+                                        tr("SMC failed after maximum measurements %1, the final results are "
+                                           "averaged.  Press OK to exit online mode")
+                                            .arg(job.getMaxSamples()),
+                                        &TargetingScreen::onCloseLabModeJobCompletePopup);
 }
 
 void TargetingScreen::onShowTerminatePopup()

@@ -10,6 +10,7 @@
 #include <QImage>
 #include <QPixmap>
 #include <QPoint>
+#include <QPointer>
 #include <QTimer>
 
 #include <vector>
@@ -184,6 +185,9 @@ private:
     QElapsedTimer m_frameClock;
     qint64 m_frameRequestedUs = -1;
     qint64 m_framesShown = 0;
+    // The end-of-SMC popup once: the constructor and the init step both
+    // look at an ended job.
+    QPointer<PopupPanel> m_smcEndPopup;
 };
 
 #endif // TARGETINGSCREEN_H

@@ -80,6 +80,7 @@ private slots:
     void init();
     void cleanup();
 
+    void jobListStartReachesTargeting();
     void pressWithNoFootIsUsedUpFor2s();
     void partFeetWithoutOverrideInforms();
     void overrideMeasureAfterLiftStartsNothing();
@@ -92,6 +93,7 @@ private slots:
     void simpleAverageOfSizeZeroShowsThreeNumbers();
     void smcTerminateFromTheThirdSample();
     void lastSampleEndsTheJob();
+    void completeJobOpenedLeavesAtInit();
     void jobTimeLimitClosesAndKeepsTheJob();
     void hotSampleWarnsOnce();
     void onlineModeLooksAndLeaves();
@@ -261,6 +263,24 @@ void tst_Targeting::measureOnce()
     QTRY_COMPARE_WITH_TIMEOUT(localSamples(), before + 1, 8000);
 }
 
+void tst_Targeting::jobListStartReachesTargeting()
+{
+    DataManager* data = DataManager::instance();
+    Job job;
+    job.clearContents();
+    m_jobName = QStringLiteral("T%1").arg(++m_jobCounter);
+    job.setName(m_jobName);
+    job.setJobAveragingMode(JOB_AVG_MODE_NONE);
+    job.setJobSize(3);
+    const unsigned index = data->addJob(job);
+    QVERIFY(index != NO_INDEX);
+    data->setActiveJob(index);
+    m_master->findChild<JobListScreen*>()->onStartJob();
+    QTRY_VERIFY_WITH_TIMEOUT(screen() != nullptr, 5000);
+    QTRY_VERIFY_WITH_TIMEOUT(screen()->isTargetingTimerActive() && screen()->framesShown() > 0, 5000);
+    QVERIFY(requestedScreens().isEmpty());
+}
+
 void tst_Targeting::pressWithNoFootIsUsedUpFor2s()
 {
     TargetingScreen* s = openJob(JOB_AVG_MODE_NONE, 3);
@@ -367,6 +387,12 @@ void tst_Targeting::pressRightAfterPopupCloseIsIgnored()
     QCOMPARE(idle, s->idlePopup());
     QCOMPARE(idle->headerText(), QStringLiteral("Continue Measuring?"));
     QVERIFY(!s->isTargetingTimerActive());
+
+    // Behind the popup the last reading no longer counts.
+    press();
+    QTest::qWait(500);
+    QCOMPARE(serverSamples(m_jobName), 0);
+    QTRY_VERIFY_WITH_TIMEOUT(s->isDebounced(), 3000);
 
     QTest::mouseClick(idle->findChild<QPushButton*>(QStringLiteral("Btn")), Qt::LeftButton);
     QVERIFY(s->popups().empty());
@@ -548,6 +574,22 @@ void tst_Targeting::smcTerminateFromTheThirdSample()
     QTest::mouseClick(s->popups().back()->findChild<QPushButton*>(QStringLiteral("BtnCancel")), Qt::LeftButton);
     QVERIFY(s->popups().empty());
     QTRY_VERIFY_WITH_TIMEOUT(s->isTargetingTimerActive(), 3000);
+
+    // Store Average force-finishes the job: one notice, and OK ends it.
+    QPointer<TargetingScreen> guard(s);
+    QTest::mouseClick(done, Qt::LeftButton);
+    QTest::mouseClick(s->popups().back()->findChild<QPushButton*>(QStringLiteral("BtnStoreAverage")),
+                      Qt::LeftButton);
+    QTRY_VERIFY_WITH_TIMEOUT(topPopup<NotificationPopup>() != nullptr, 5000);
+    QTest::qWait(500);
+    QCOMPARE(int(s->popups().size()), 1);
+    NotificationPopup* notice = topPopup<NotificationPopup>();
+    QCOMPARE(notice->headerText(), QStringLiteral("Warning"));
+    QCOMPARE(notice->messageText(), QStringLiteral("SMC force finished, all readings averaged for result."));
+    QVERIFY(control(QStringLiteral("jobs")).contains(QStringLiteral("\"%1\"  LOCAL").arg(m_jobName)));
+    QTest::mouseClick(notice->findChild<QPushButton*>(QStringLiteral("Btn")), Qt::LeftButton);
+    QTRY_VERIFY_WITH_TIMEOUT(requestedScreens().contains(JOB_MEASURE_SCREEN_ID), 5000);
+    QTRY_VERIFY_WITH_TIMEOUT(guard.isNull(), 3000);
 }
 
 void tst_Targeting::lastSampleEndsTheJob()
@@ -575,6 +617,22 @@ void tst_Targeting::lastSampleEndsTheJob()
     QTRY_VERIFY_WITH_TIMEOUT(guard.isNull(), 3000);
     QCOMPARE(m_master->currentScreen()->objectName(), QStringLiteral("StandIn%1").arg(int(JOB_MEASURE_SCREEN_ID)));
     QCOMPARE(serverSamples(m_jobName), 2);
+}
+
+void tst_Targeting::completeJobOpenedLeavesAtInit()
+{
+    // A job already complete when the screen is built: the screen first
+    // stands, then leaves for the summary from its init step.
+    DataManager* data = DataManager::instance();
+    data->setActiveJob(data->findJobByName(QStringLiteral("Job 1")));
+    QVERIFY(data->getActiveJobObject().isJobComplete());
+    m_master->onAddScreenToStack(TARGETING_SCREEN_ID);
+    QPointer<TargetingScreen> guard(screen());
+    QVERIFY(guard);
+    QTRY_VERIFY_WITH_TIMEOUT(requestedScreens().contains(JOB_MEASURE_SCREEN_ID), 5000);
+    QTRY_VERIFY_WITH_TIMEOUT(guard.isNull(), 3000);
+    QCOMPARE(m_master->screenCount(), 2);
+    QCOMPARE(m_master->currentScreen()->objectName(), QStringLiteral("StandIn%1").arg(int(JOB_MEASURE_SCREEN_ID)));
 }
 
 void tst_Targeting::jobTimeLimitClosesAndKeepsTheJob()

@@ -88,6 +88,14 @@ QList<Tour::Stop> stops()
              if (TargetingScreen* s = normal(d))
                  s->onShowTempWarningPopup();
          }},
+        {"targeting_popup_temperature_online", [](QWidget* d) {
+             UserParams::setLabModeJob(QStringLiteral("Job 8"));
+             if (TargetingScreen* s = targeting(d, QStringLiteral("Job 8"), feet(true, true, true), 0, true)) {
+                 UserParams::setLabModeJob(QStringLiteral("Job 8"));
+                 s->onShowTempWarningPopup();
+             }
+             UserParams::setLabModeJob(QString());
+         }},
         {"targeting_popup_override", [](QWidget* d) {
              if (TargetingScreen* s = targeting(d, QStringLiteral("Job"), feet(true, false, true), 8))
                  s->onShowOverridePopup();
@@ -104,21 +112,22 @@ QList<Tour::Stop> stops()
              if (TargetingScreen* s = normal(d))
                  s->onShowTimeoutPopup();
          }},
+        // An SMC job that has ended raises its popup by itself.
         {"targeting_popup_smc_maximum", [](QWidget* d) {
-             if (TargetingScreen* s = targeting(d, QStringLiteral("Job 5"), feet(true, true, true), 0))
-                 s->onShowSMCPopup();
+             targeting(d, QStringLiteral("Job 5"), feet(true, true, true), 0);
          }},
         {"targeting_popup_smc_forced", [](QWidget* d) {
-             if (TargetingScreen* s = targeting(d, QStringLiteral("Job 6"), feet(true, true, true), 0))
-                 s->onShowSMCPopup();
+             targeting(d, QStringLiteral("Job 6"), feet(true, true, true), 0);
          }},
         {"targeting_popup_online_complete", [](QWidget* d) {
              if (TargetingScreen* s = targeting(d, QStringLiteral("Job 8"), feet(true, true, true), 0, true))
                  s->onShowLabModeJobCompletePopup();
          }},
         {"targeting_popup_online_smc_failed", [](QWidget* d) {
-             if (TargetingScreen* s = targeting(d, QStringLiteral("Job 5"), feet(true, true, true), 0, true))
-                 s->onShowLabModeSMCJobCompletePopup();
+             targeting(d, QStringLiteral("Job 5"), feet(true, true, true), 0, true);
+         }},
+        {"targeting_popup_online_smc_forced", [](QWidget* d) {
+             targeting(d, QStringLiteral("Job 6"), feet(true, true, true), 0, true);
          }},
         {"targeting_popup_terminate", [](QWidget* d) {
              if (TargetingScreen* s = targeting(d, QStringLiteral("Job 4"), feet(true, true, true), 0))
