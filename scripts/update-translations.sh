@@ -24,7 +24,9 @@ text = open(path, encoding="utf-8").read()
 def fill(m):
     source = m.group(1)
     return "<source>%s</source>\n        <translation>%s</translation>" % (source, source)
-text = re.sub(r"<source>(.*?)</source>\s*<translation type=\"unfinished\">\s*</translation>", fill, text, flags=re.S)
-text = re.sub(r"<source>(.*?)</source>\s*<translation type=\"unfinished\"/>", fill, text, flags=re.S)
+# A source never holds a raw "<" (the file escapes it), so a match stays inside
+# its own message.
+text = re.sub(r"<source>([^<]*)</source>\s*<translation type=\"unfinished\">[^<]*</translation>", fill, text)
+text = re.sub(r"<source>([^<]*)</source>\s*<translation type=\"unfinished\"/>", fill, text)
 open(path, "w", encoding="utf-8").write(text)
 PY

@@ -2,6 +2,221 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="ko_KR">
 <context>
+    <name>CalibrationNeededPopup</name>
+    <message>
+        <source>Calibration Required</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>New measurements cannot be made until the instrument is calibrated. Press Calibrate to start the calibration sequence.</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Ignore</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Calibration needed within %1 %2</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>seconds</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>minutes</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>hours</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>days</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationPopup</name>
+    <message>
+        <source>Calibration Starting</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Calibrating</source>
+        <translation type="unfinished">교정 중</translation>
+    </message>
+    <message>
+        <source>Do not touch or bump instrument</source>
+        <translation type="unfinished">기기를 만지거나 부딪히지 마십시오</translation>
+    </message>
+    <message>
+        <source>Calculating</source>
+        <translation type="unfinished">계산 중</translation>
+    </message>
+    <message>
+        <source>Complete</source>
+        <translation type="unfinished">완료</translation>
+    </message>
+    <message>
+        <source>OK to move instrument</source>
+        <translation type="unfinished">기기를 움직여도 됩니다</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationReferenceCheckPopup</name>
+    <message>
+        <source>Measurement Starting</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Measuring</source>
+        <translation type="unfinished">측정 중</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationReferenceWizardPageContainer</name>
+    <message>
+        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationSelfTestOtherWizardPageContainer</name>
+    <message>
+        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationSelfTestReferenceWizardPageContainer</name>
+    <message>
+        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationSelfTestWhiteWizardPageContainer</name>
+    <message>
+        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationSensorPopup</name>
+    <message>
+        <source>Not all pressure sensors are active. Press the OK button to start the calibration when all pressure sensors are active</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Incorrect Position</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation type="unfinished">확인</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation type="unfinished">취소</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationStep2PageContents</name>
+    <message>
+        <source>PLACE ON A FLAT SURFACE</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>ALIGN WHITE LINE</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationStep3PageContents</name>
+    <message>
+        <source>Tap the calibrate button to start calibration</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>or</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Press the measurement button on the instrument</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationWhiteWizardPageContainer</name>
+    <message>
+        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Serial Number: %1</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationWizardPage</name>
+    <message>
+        <source>Step 1</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Step %1</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationWizardScreen</name>
+    <message>
+        <source>Calibration</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Back</source>
+        <translation type="unfinished">뒤로</translation>
+    </message>
+    <message>
+        <source>Self Test %1: %2</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Reference Tile Check</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
     <name>DaddyPanel</name>
     <message>
         <source>Warning</source>
@@ -145,6 +360,17 @@
     </message>
 </context>
 <context>
+    <name>DeleteAllSamplesPopup</name>
+    <message>
+        <source>Clear Database</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Are you sure you want to clear the database, this will delete all samples and jobs from the instrument?</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
     <name>DeletePopup</name>
     <message>
         <source>Delete All Samples?</source>
@@ -206,6 +432,28 @@
     <message>
         <source>Execute Job</source>
         <translation>작업 실행</translation>
+    </message>
+</context>
+<context>
+    <name>JobFreeTextEditScreen</name>
+    <message>
+        <source>Notes</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>JobKeypadScreen</name>
+    <message>
+        <source>OK</source>
+        <translation type="unfinished">확인</translation>
+    </message>
+    <message>
+        <source>ABC</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Special Keys</source>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -354,6 +602,51 @@
     </message>
 </context>
 <context>
+    <name>JobNameEditScreen</name>
+    <message>
+        <source>Name</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Job Name cannot be empty</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Enter a unique job name that is not empty</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Job Name Already Exists</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>This job name already exists.  Please change the name to a unique name</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>JobTagEditScreen</name>
+    <message>
+        <source>Tag Name Does Not Exist</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>This tag name does not exist. Please change the name to an existing tag name</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>Keypad</name>
+    <message>
+        <source>123</source>
+        <translation type="unfinished">123</translation>
+    </message>
+    <message>
+        <source>ABC</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
     <name>LockScreen</name>
     <message>
         <source>Instrument Locked</source>
@@ -396,6 +689,21 @@
     <message>
         <source>Cancel</source>
         <translation>취소</translation>
+    </message>
+</context>
+<context>
+    <name>RestoreFactorySettingsPopup</name>
+    <message>
+        <source>Confirm by moving the dot around the circle</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Restore Factory Settings</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>All current user settings will go back to defaults. Any jobs or samples will also be lost!</source>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -468,6 +776,538 @@
     <message>
         <source>Delete</source>
         <translation>삭제</translation>
+    </message>
+</context>
+<context>
+    <name>SelfTestListItem</name>
+    <message>
+        <source>Pass</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Fail</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Canceled</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Error</source>
+        <translation type="unfinished">오류</translation>
+    </message>
+</context>
+<context>
+    <name>SelfTestPopup</name>
+    <message>
+        <source>Hold the instrument in open air</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Do not touch or bump instrument</source>
+        <translation type="unfinished">기기를 만지거나 부딪히지 마십시오</translation>
+    </message>
+    <message>
+        <source>Complete</source>
+        <translation type="unfinished">완료</translation>
+    </message>
+</context>
+<context>
+    <name>SelfTestScreen</name>
+    <message>
+        <source>Self Test</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation type="unfinished">확인</translation>
+    </message>
+    <message>
+        <source>White Calibration</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Reference check on white</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Effect tile test</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Repeatability tests</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Temperature tests</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Pressure sensor test</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Check error logs</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Testing...</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>All Tests Complete</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Self Tests Canceled</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDatabaseMemoryPage</name>
+    <message>
+        <source>Database / Memory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Samples</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Jobs</source>
+        <translation type="unfinished">작업</translation>
+    </message>
+    <message>
+        <source>Clear Database</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDirectoryExplorerPage</name>
+    <message>
+        <source>No files</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDisplayPage</name>
+    <message>
+        <source>Display Settings</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Display Brightness</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>SettingsFileViewerPage</name>
+    <message>
+        <source>The file can&apos;t be shown.</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>The file can&apos;t be read.</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>SettingsLanguagePage</name>
+    <message>
+        <source>Language</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>SettingsLegalInformationPage</name>
+    <message>
+        <source>Legal Information</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionPowerInfo</name>
+    <message>
+        <source>%1 hour </source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>%1 hours </source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>%1 minutes and </source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>%1 seconds</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Never</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Display dims after: %1
+Standby after: %2
+Power off after: %3</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionProgressItem</name>
+    <message>
+        <source>%1%</source>
+        <translation type="unfinished">%1: {1%?}</translation>
+    </message>
+    <message>
+        <source>%1 of %2</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionSliderItem</name>
+    <message>
+        <source>Never</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>SettingsMainPage</name>
+    <message>
+        <source>Settings</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Valid</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Expired</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Not Connected</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>%1</source>
+        <translation type="unfinished">%1: {1?}</translation>
+    </message>
+    <message>
+        <source>%1%</source>
+        <translation type="unfinished">%1: {1%?}</translation>
+    </message>
+    <message>
+        <source>Power</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Language</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Calibration</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Measurement Options</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Wi-Fi</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Display Settings</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Beeper Volume</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Power Saving Options</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>System &amp; Diagnostics</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>SettingsMeasurementPage</name>
+    <message>
+        <source>On</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Measurement Options</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Auto Measurement</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Time to start auto measurement (sec):</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Measurement Mode</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>No. of good measurements required:</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Maximum measurements:</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Auto Measurements: %1</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Display LABCH: %1</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Override Pressure Sensors: %1</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPowerOptionsPage</name>
+    <message>
+        <source>Power Saving
+Options</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Dim Display</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Standby Mode</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Power Off</source>
+        <translation type="unfinished">전원 끄기</translation>
+    </message>
+    <message>
+        <source>Seconds until display dims:</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Minutes until standby mode:</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Minutes until power off:</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPowerPage</name>
+    <message>
+        <source>Power</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Power Off</source>
+        <translation type="unfinished">전원 끄기</translation>
+    </message>
+    <message>
+        <source>Reboot</source>
+        <translation type="unfinished">재부팅</translation>
+    </message>
+    <message>
+        <source>Shutdown Instrument?</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Are you sure you want to shutdown the instrument?</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Enter Standby Mode?</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Are you sure you want to put the instrument into standby mode?</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Reboot Instrument?</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Are you sure you want to reboot the instrument?</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Yes</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>No</source>
+        <translation type="unfinished">아니요</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsSystemAndDiagnosticsPage</name>
+    <message>
+        <source>System &amp;
+Diagnostics</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>System Information</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Database / Memory</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Legal Information</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>SettingsSystemInformationPage</name>
+    <message>
+        <source>System Information</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Not Configured</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Instrument Model:</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Instrument Serial:</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Part Number:</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>White Reference Tile:</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Certification Date:</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Firmware Revision:</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Interface Revision:</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Kernel:</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Bootloader:</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Server URL:</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Restore Factory Settings</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Open Source</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Burn in BIRCH JuniperX/Juniper</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Burn in ALDER Larch</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Burn in Spruce / Sequoia</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>SettingsVolumePage</name>
+    <message>
+        <source>Beeper Volume</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
+    <name>SettingsWifiPage</name>
+    <message>
+        <source>Wi-Fi</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>On</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Static IP</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>DHCP</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Known Networks</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Unknown Networks</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Connection Issue</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Incorrect password</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Network not in range</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation type="unfinished">확인</translation>
     </message>
 </context>
 <context>
@@ -709,6 +1549,153 @@
     </message>
 </context>
 <context>
+    <name>TargetingScreen</name>
+    <message>
+        <source>Job</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Press button to measure.</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Targeting</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Averaged 0 of SMC 0:0</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Measure</source>
+        <translation type="unfinished">측정</translation>
+    </message>
+    <message>
+        <source>Terminate</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Online Mode</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Averaged %1 of SMC %2:%3</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation type="unfinished">확인</translation>
+    </message>
+    <message>
+        <source>Exit Online Mode?</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Exiting online mode will stop targeting and return to the job list.</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Exit</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Stop Measuring?</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>All measured samples and this job will be permanently deleted.</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>All measured samples from this job will be permanently deleted.</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Warning</source>
+        <translation type="unfinished">경고</translation>
+    </message>
+    <message>
+        <source>Continue</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Temperature out of range.  Continue online mode until complete, or Exit online mode and return to the job list?</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Temperature out of range.  Continue job until complete, or delete job and all samples and return to the job list?</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Temperature out of range.  Continue job until complete, or delete all samples and return to the job list?</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Delete</source>
+        <translation type="unfinished">삭제</translation>
+    </message>
+    <message>
+        <source>Override Pressure Sensors?</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Not all pressure sensors are active. Press the measure button again to start a measurement, otherwise press the cancel button to return to targeting mode.</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation type="unfinished">취소</translation>
+    </message>
+    <message>
+        <source>Information</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Not all pressure sensors are active. Please ensure all pressure sensors are active before measuring</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Continue Measuring?</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>To continue with measurements, press OK</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Job Time Elapsed</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>The job wasn&apos;t completed within the allocated time</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>SMC force finished, all readings averaged for result.</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Maximum number of SMC measurements used for this job</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>Complete</source>
+        <translation type="unfinished">완료</translation>
+    </message>
+    <message>
+        <source>The job has completed.  Press OK to exit online mode</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>SMC force finished, all readings averaged for result.  Press OK to exit online mode</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>SMC failed after maximum measurements %1, the final results are averaged.  Press OK to exit online mode</source>
+        <translation type="unfinished"></translation>
+    </message>
+</context>
+<context>
     <name>TerminateJobPopup</name>
     <message>
         <source>Store Average</source>
@@ -739,6 +1726,21 @@
     <message>
         <source>Send All Jobs To Server</source>
         <translation>모든 작업을 서버로 전송</translation>
+    </message>
+</context>
+<context>
+    <name>WifiPasswordScreen</name>
+    <message>
+        <source>Password</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>ABC</source>
+        <translation type="unfinished"></translation>
+    </message>
+    <message>
+        <source>@&amp;*</source>
+        <translation type="unfinished"></translation>
     </message>
 </context>
 </TS>
