@@ -3,6 +3,7 @@
 #include "GUIAPI/API_SignalMaster.h"
 #include "GUIAPI/DataManager.h"
 #include "Screens/DaddyPanel.h"
+#include "Screens/JobEditScreens.h"
 #include "Screens/JobListScreen.h"
 #include "Screens/LockScreen.h"
 #include "Screens/SadPuppyScreen.h"
@@ -144,6 +145,14 @@ QWidget* ScreenMaster::createScreen(SCREEN_ID_T id)
     case SYNC_SCREEN_ID: return new SyncScreen(this);
     case LOCK_SCREEN_ID: return new LockScreen(this);
     case SAD_PUPPY_POPUP_SCREEN_ID: return new SadPuppyScreen(this);
+    case JOB_NAME_SCREEN_ID: return new JobNameEditScreen(this);
+    case JOB_TAGS_1_SCREEN_ID: return new JobTagEditScreen(TAG_STATE_1, this);
+    case JOB_TAGS_2_SCREEN_ID: return new JobTagEditScreen(TAG_STATE_2, this);
+    case JOB_TAGS_3_SCREEN_ID: return new JobTagEditScreen(TAG_STATE_3, this);
+    case JOB_TAGS_1_FREE_EDIT_SCREEN_ID: return new JobTagFreeEditScreen(TAG_STATE_1, this);
+    case JOB_TAGS_2_FREE_EDIT_SCREEN_ID: return new JobTagFreeEditScreen(TAG_STATE_2, this);
+    case JOB_TAGS_3_FREE_EDIT_SCREEN_ID: return new JobTagFreeEditScreen(TAG_STATE_3, this);
+    case JOB_FREE_TEXT_SCREEN_ID: return new JobFreeTextEditScreen(this);
     default: return nullptr;
     }
 }
