@@ -5,7 +5,28 @@
 
 #include <QLabel>
 #include <QPlainTextEdit>
+#include <QScopedValueRollback>
 #include <QTextCursor>
+
+namespace {
+// Keypad screens in Korean and Chinese compose through this class.
+const bool s_registered = [] {
+    JobKeypadScreen::setComposerFactory(&MultilingualComposer::create);
+    return true;
+}();
+} // namespace
+
+MultilingualComposer* MultilingualComposer::create(JobKeypadScreen* screen, const QString& languageCode)
+{
+    // The table is read afresh at every opening; what came before may have
+    // been another language's.
+    MarigoldUIM::instance()->initUIM(languageCode);
+    int top = 0;
+    if (QWidget* field = screen->findChild<QWidget*>(QStringLiteral("labelTextBackground")))
+        top = field->geometry().bottom() + 2;
+    return new MultilingualComposer(screen->getTextEditPointer(), screen,
+                                    screen->multilingualBufferLabel(), top);
+}
 
 MultilingualComposer::MultilingualComposer(QPlainTextEdit* field, QWidget* stripParent,
                                            QLabel* bufferLabel, int stripTop, QObject* parent)
@@ -15,6 +36,17 @@ MultilingualComposer::MultilingualComposer(QPlainTextEdit* field, QWidget* strip
     , m_bufferLabel(bufferLabel)
     , m_stripTop(stripTop)
 {
+    if (m_field)
+        connect(m_field, &QPlainTextEdit::cursorPositionChanged, this, &MultilingualComposer::onCursorMoved);
+}
+
+void MultilingualComposer::onCursorMoved()
+{
+    if (m_editing || !m_pMultilingualPopup || !m_field)
+        return;
+    const QTextCursor cursor = m_field->textCursor();
+    if (!cursor.hasSelection() || cursor.selectionStart() != m_CursorStartingPosition)
+        cancel();
 }
 
 MultilingualComposer::~MultilingualComposer()
@@ -28,6 +60,7 @@ bool MultilingualComposer::keyPressed(const QString& text)
         m_multilingualBuffer.append(text);
         // With a spelling the strip always has the spelling itself to show.
         if (!showCandidates(m_multilingualBuffer) && !m_pMultilingualPopup && m_field) {
+            QScopedValueRollback<bool> editing(m_editing, true);
             QTextCursor cursor = m_field->textCursor();
             cursor.insertText(text);
             m_field->setTextCursor(cursor);
@@ -76,6 +109,7 @@ void MultilingualComposer::onCharsSelected(QString chars)
 {
     if (!m_field)
         return;
+    QScopedValueRollback<bool> editing(m_editing, true);
     QTextCursor cursor = m_field->textCursor();
     if (chars == QLatin1String(" ")) {
         cursor.setKeepPositionOnInsert(false);
@@ -103,6 +137,7 @@ void MultilingualComposer::onCharsSelected(QString chars)
 void MultilingualComposer::enterPressed()
 {
     if (m_field) {
+        QScopedValueRollback<bool> editing(m_editing, true);
         QTextCursor cursor = m_field->textCursor();
         cursor.setPosition(cursor.position());
         m_field->setTextCursor(cursor);

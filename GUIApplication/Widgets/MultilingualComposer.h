@@ -5,6 +5,7 @@
 #include <QPointer>
 #include <QString>
 
+#include "Screens/JobKeypadScreen.h"
 #include "Widgets/MultilingualPopup.h"
 
 class QLabel;
@@ -15,8 +16,13 @@ class QWidget;
 // last commit is the spelling (as the key labels read, so in capitals); its
 // candidates from the input table stand in the strip, the selected one
 // stands selected in the field, Space steps on, Enter commits and Delete
-// shortens the spelling. The table is the one MarigoldUIM holds.
-class MultilingualComposer : public QObject
+// shortens the spelling. The table is the one MarigoldUIM holds. Moving the
+// cursor away from the composition (a tap in the field) ends it as it
+// stands.
+//
+// Every multilingual JobKeypadScreen gets one (see create()), which loads
+// the table of its language.
+class MultilingualComposer : public QObject, public KeypadComposer
 {
     Q_OBJECT
 public:
@@ -26,12 +32,15 @@ public:
                          int stripTop, QObject* parent = nullptr);
     ~MultilingualComposer() override;
 
+    // The composer of a keypad screen in the language, its table loaded.
+    static MultilingualComposer* create(JobKeypadScreen* screen, const QString& languageCode);
+
     // A key or the blank: always taken.
-    bool keyPressed(const QString& text);
+    bool keyPressed(const QString& text) override;
     // True when Delete only shortened the spelling; false when the caller
     // still has to delete (the strip is gone then).
-    bool deletePressed();
-    void enterPressed();
+    bool deletePressed() override;
+    void enterPressed() override;
     // Drops the composition, leaving the text as it stands.
     void cancel();
 
@@ -46,6 +55,9 @@ public:
 public slots:
     void onCharsSelected(QString chars);
 
+private slots:
+    void onCursorMoved();
+
 private:
     void destroyPopup();
     void setBufferLabel(const QString& text);
@@ -58,6 +70,7 @@ private:
     QString m_multilingualBuffer;
     QPointer<MultilingualPopup> m_pMultilingualPopup;
     int m_CursorStartingPosition = 0;
+    bool m_editing = false;
 };
 
 #endif // MULTILINGUALCOMPOSER_H
