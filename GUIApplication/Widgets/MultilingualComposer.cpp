@@ -24,8 +24,13 @@ MultilingualComposer* MultilingualComposer::create(JobKeypadScreen* screen, cons
     int top = 0;
     if (QWidget* field = screen->findChild<QWidget*>(QStringLiteral("labelTextBackground")))
         top = field->geometry().bottom() + 2;
-    return new MultilingualComposer(screen->getTextEditPointer(), screen,
-                                    screen->multilingualBufferLabel(), top);
+    // With a special page the function row covers the spelling's label
+    // whole, and only a sliver of it would show below the keys; the strip
+    // shows the spelling anyway.
+    QLabel* label = screen->multilingualBufferLabel();
+    if (screen->btnSpecial() && !screen->btnSpecial()->isHidden())
+        label = nullptr;
+    return new MultilingualComposer(screen->getTextEditPointer(), screen, label, top);
 }
 
 MultilingualComposer::MultilingualComposer(QPlainTextEdit* field, QWidget* stripParent,
