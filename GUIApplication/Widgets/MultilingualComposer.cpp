@@ -64,7 +64,7 @@ bool MultilingualComposer::keyPressed(const QString& text)
     if (text != QLatin1String(" ")) {
         m_multilingualBuffer.append(text);
         // With a spelling the strip always has the spelling itself to show.
-        if (!showCandidates(m_multilingualBuffer) && !m_pMultilingualPopup && m_field) {
+        if (!showCandidates() && !m_pMultilingualPopup && m_field) {
             QScopedValueRollback<bool> editing(m_editing, true);
             QTextCursor cursor = m_field->textCursor();
             cursor.insertText(text);
@@ -80,9 +80,8 @@ bool MultilingualComposer::keyPressed(const QString& text)
     return true;
 }
 
-bool MultilingualComposer::showCandidates(const QString& buffer)
+bool MultilingualComposer::showCandidates()
 {
-    Q_UNUSED(buffer);
     if (m_multilingualBuffer.isEmpty())
         return false;
     const QVector<QChar> chars = MarigoldUIM::instance()->GetCharVector(m_multilingualBuffer.toLower());
@@ -156,7 +155,7 @@ bool MultilingualComposer::deletePressed()
 {
     if (m_pMultilingualPopup && m_multilingualBuffer.size() >= 2) {
         m_multilingualBuffer.chop(1);
-        showCandidates(m_multilingualBuffer);
+        showCandidates();
         return true;
     }
     cancel();

@@ -46,7 +46,7 @@ public:
 
     // Looks the spelling up and shows its candidates, selecting the first;
     // false for an empty spelling.
-    bool showCandidates(const QString& buffer);
+    bool showCandidates();
 
     QString buffer() const { return m_multilingualBuffer; }
     MultilingualPopup* popup() const { return m_pMultilingualPopup; }

@@ -109,11 +109,7 @@ void MultilingualPopup::updateList(const QVector<QString>& list)
         auto* button = new UimButton(list.at(i));
         if (list.at(i).size() > 1) {
             // The typed spelling stands among the characters: give it room.
-            const int width = button->GetTextWidth() + 10;
-            const QRect g = button->geometry();
-            const int left = (g.center().x() - width) / 2;
-            button->setFixedSize(qMax(width, int(UimButton::kSize)), UimButton::kSize);
-            button->setGeometry(QRect(left, g.top(), button->width(), g.height()));
+            button->setFixedSize(qMax(button->GetTextWidth() + 10, int(UimButton::kSize)), UimButton::kSize);
         }
         connect(button, &QAbstractButton::clicked, m_pSignalMapper,
                 static_cast<void (QSignalMapper::*)()>(&QSignalMapper::map));
