@@ -10,6 +10,7 @@ PACKAGES=(
   liblcms2-dev
   xvfb x11vnc xdotool imagemagick alsa-utils sox
   fonts-liberation fonts-roboto fonts-noto-cjk
+  python3 uim-data m17n-db
 )
 if [ "${1:-}" = "--fuzz" ]; then
   PACKAGES+=(clang libclang-rt-14-dev)
