@@ -3,6 +3,7 @@
 #include "ui_WifiPasswordScreen.h"
 
 #include "GUIAPI/DataManager.h"
+#include "Widgets/SettingsPage.h"
 #include "Widgets/KLabel.h"
 #include "Widgets/Theme.h"
 #include "Widgets/XPushButton.h"
@@ -45,6 +46,7 @@ WifiPasswordScreen::WifiPasswordScreen(QWidget* parent)
     , ui(new Ui::WifiPasswordScreen)
 {
     ui->setupUi(this);
+    ui->BtnBack->setIcon(SettingsPage::backButtonIcon());
     setObjectName(QStringLiteral("WifiPasswordScreen"));
     ui->TxtTitle->setAutoSize(true);
     ui->BtnDisplayPassword->setIcon(QIcon(QStringLiteral(":/Assets/eye_close.png")));
@@ -190,7 +192,8 @@ void WifiPasswordScreen::updateKeypad()
         }
     }
     if (BtnSpecial) {
-        BtnSpecial->setText(m_displaySpecial ? tr("ABC") : tr("@&*"));
+        // A button reads "&" as the mark of a shortcut key.
+        BtnSpecial->setText(QString(m_displaySpecial ? tr("ABC") : tr("@&*")).replace('&', QStringLiteral("&&")));
         BtnSpecial->setFont(Theme::font(Theme::FontHeadline, true));
     }
     if (BtnShift)

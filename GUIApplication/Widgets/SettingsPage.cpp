@@ -42,6 +42,7 @@ SettingsPage::~SettingsPage()
 void SettingsPage::construct(const QString& title, const QString& icon)
 {
     ui->setupUi(this);
+    ui->BtnBack->setIcon(backButtonIcon());
     ui->labelSubHeader->setWordWrap(true);
     ui->labelSubHeader->setAutoSize(true);
     ui->SettingsList->setShadowsEnabled(true);
@@ -84,17 +85,26 @@ void SettingsPage::setIcon(const QString& icon)
     updateIconLocation();
 }
 
+QIcon SettingsPage::backButtonIcon(const QString& mark)
+{
+    QImage canvas(QStringLiteral(":/Assets/back_button.png"));
+    if (canvas.isNull())
+        return QIcon();
+    canvas = canvas.convertToFormat(QImage::Format_ARGB32);
+    QPainter painter(&canvas);
+    painter.setCompositionMode(QPainter::CompositionMode_Clear);
+    painter.fillRect(QRect(canvas.width() - 3, 0, 3, canvas.height()), Qt::transparent);
+    painter.setCompositionMode(QPainter::CompositionMode_SourceOver);
+    const QPixmap picture(mark);
+    if (!picture.isNull())
+        painter.drawPixmap(78, (canvas.height() - picture.height()) / 2, picture);
+    painter.end();
+    return QIcon(QPixmap::fromImage(canvas));
+}
+
 void SettingsPage::setBackIcon(const QString& icon)
 {
-    // The page's own mark stands right of the chevron, on the button.
-    QPixmap canvas(QStringLiteral(":/Assets/back_button.png"));
-    const QPixmap mark(icon);
-    if (!canvas.isNull() && !mark.isNull()) {
-        QPainter painter(&canvas);
-        const int x = 78;
-        painter.drawPixmap(x, (canvas.height() - mark.height()) / 2, mark);
-    }
-    ui->BtnBack->setIcon(QIcon(canvas));
+    ui->BtnBack->setIcon(backButtonIcon(icon));
 }
 
 void SettingsPage::setBackButtonVisible(bool visible)
@@ -137,7 +147,7 @@ void SettingsPage::updateIconLocation()
     const QFontMetrics metrics(ui->labelSubHeader->defaultFont());
     for (const QString& line : ui->labelSubHeader->defaultText().split('\n'))
         textWidth = qMax(textWidth, metrics.horizontalAdvance(line));
-    textWidth += 4;
+    textWidth += 10;
     if (!hasIcon) {
         ui->labelSubHeader->setGeometry(left, 0, 198, ui->labelSubHeader->height());
         ui->labelSubHeader->setText(ui->labelSubHeader->defaultText());

@@ -34,6 +34,9 @@ public:
     FlickList* getSettingsList() const;
     void gotoNextPage(SettingsPage* page);
     QSignalMapper* signalMapper() const { return m_signalMapper; }
+    // The back button's picture without its divider (titles run under it),
+    // with an optional mark beside the chevron.
+    static QIcon backButtonIcon(const QString& mark = QString());
 
 signals:
     void GotoScreen(SCREEN_ID_T id);

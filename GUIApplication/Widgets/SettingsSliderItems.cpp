@@ -61,6 +61,7 @@ void SettingsListSelectionSliderItem::build(bool compressed)
     labelSummaryText->setObjectName(QStringLiteral("labelSummaryText"));
     labelSummaryText->setStyleSheet(QStringLiteral("color: %1; background: transparent;").arg(Theme::css(Theme::TextBody)));
     labelSummaryText->setFont(Theme::font(compressed ? Theme::FontBody : Theme::FontHeadline));
+    labelSummaryText->setWordWrap(true);
     labelSummaryText->setAutoSize(true);
     labelSummaryText->setGeometry(20, compressed ? 6 : 12, 214, compressed ? 30 : 34);
 
