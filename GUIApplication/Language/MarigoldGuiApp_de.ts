@@ -583,4 +583,496 @@
         <translation>Alle Aufträge an Server senden</translation>
     </message>
 </context>
+<context>
+    <name>SettingsMainPage</name>
+    <message>
+        <source>Settings</source>
+        <translation>Einstellungen</translation>
+    </message>
+    <message>
+        <source>Valid</source>
+        <translation>Gültig</translation>
+    </message>
+    <message>
+        <source>Expired</source>
+        <translation>Abgelaufen</translation>
+    </message>
+    <message>
+        <source>Not Connected</source>
+        <translation>Nicht verbunden</translation>
+    </message>
+    <message>
+        <source>%1</source>
+        <translation>%1</translation>
+    </message>
+    <message>
+        <source>%1%</source>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>Power</source>
+        <translation>Ein/Aus</translation>
+    </message>
+    <message>
+        <source>Language</source>
+        <translation>Sprache</translation>
+    </message>
+    <message>
+        <source>Calibration</source>
+        <translation>Kalibrierung</translation>
+    </message>
+    <message>
+        <source>Measurement Options</source>
+        <translation>Messoptionen</translation>
+    </message>
+    <message>
+        <source>Wi-Fi</source>
+        <translation>WLAN</translation>
+    </message>
+    <message>
+        <source>Display Settings</source>
+        <translation>Anzeige</translation>
+    </message>
+    <message>
+        <source>Beeper Volume</source>
+        <translation>Signaltonlautstärke</translation>
+    </message>
+    <message>
+        <source>Power Saving Options</source>
+        <translation>Energiesparen</translation>
+    </message>
+    <message>
+        <source>System &amp; Diagnostics</source>
+        <translation>System und Diagnose</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsWifiPage</name>
+    <message>
+        <source>Wi-Fi</source>
+        <translation>WLAN</translation>
+    </message>
+    <message>
+        <source>On</source>
+        <translation>Ein</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>Aus</translation>
+    </message>
+    <message>
+        <source>Static IP</source>
+        <translation>Statische IP</translation>
+    </message>
+    <message>
+        <source>DHCP</source>
+        <translation>DHCP</translation>
+    </message>
+    <message>
+        <source>Known Networks</source>
+        <translation>Bekannte Netzwerke</translation>
+    </message>
+    <message>
+        <source>Unknown Networks</source>
+        <translation>Verfügbare Netzwerke</translation>
+    </message>
+    <message>
+        <source>Connection Issue</source>
+        <translation>Verbindungsproblem</translation>
+    </message>
+    <message>
+        <source>Incorrect password</source>
+        <translation>Falsches Passwort</translation>
+    </message>
+    <message>
+        <source>Network not in range</source>
+        <translation>Netzwerk außer Reichweite</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsMeasurementPage</name>
+    <message>
+        <source>On</source>
+        <translation>Ein</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>Aus</translation>
+    </message>
+    <message>
+        <source>Measurement Options</source>
+        <translation>Messoptionen</translation>
+    </message>
+    <message>
+        <source>Auto Measurement</source>
+        <translation>Automatische Messung</translation>
+    </message>
+    <message>
+        <source>Time to start auto measurement (sec):</source>
+        <translation>Zeit bis zur automatischen Messung (s):</translation>
+    </message>
+    <message>
+        <source>Measurement Mode</source>
+        <translation>Messmodus</translation>
+    </message>
+    <message>
+        <source>No. of good measurements required:</source>
+        <translation>Anzahl nötiger guter Messungen:</translation>
+    </message>
+    <message>
+        <source>Maximum measurements:</source>
+        <translation>Maximale Anzahl Messungen:</translation>
+    </message>
+    <message>
+        <source>Auto Measurements: %1</source>
+        <translation>Automatische Messungen: %1</translation>
+    </message>
+    <message>
+        <source>Display LABCH: %1</source>
+        <translation>LABCH anzeigen: %1</translation>
+    </message>
+    <message>
+        <source>Override Pressure Sensors: %1</source>
+        <translation>Drucksensoren übergehen: %1</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionSliderItem</name>
+    <message>
+        <source>Never</source>
+        <translation>Nie</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionProgressItem</name>
+    <message>
+        <source>%1%</source>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>%1 of %2</source>
+        <translation>%1 von %2</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionPowerInfo</name>
+    <message>
+        <source>%1 hour </source>
+        <translation>%1 Stunde </translation>
+    </message>
+    <message>
+        <source>%1 hours </source>
+        <translation>%1 Stunden </translation>
+    </message>
+    <message>
+        <source>%1 minutes and </source>
+        <translation>%1 Minuten und </translation>
+    </message>
+    <message>
+        <source>%1 seconds</source>
+        <translation>%1 Sekunden</translation>
+    </message>
+    <message>
+        <source>Never</source>
+        <translation>Nie</translation>
+    </message>
+    <message>
+        <source>Display dims after: %1
+Standby after: %2
+Power off after: %3</source>
+        <translation>Abdunkeln nach: %1
+Standby nach: %2
+Ausschalten nach: %3</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsLegalInformationPage</name>
+    <message>
+        <source>Legal Information</source>
+        <translation>Rechtliche Hinweise</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsSystemAndDiagnosticsPage</name>
+    <message>
+        <source>System &amp;
+Diagnostics</source>
+        <translation>System und
+Diagnose</translation>
+    </message>
+    <message>
+        <source>System Information</source>
+        <translation>Systeminformationen</translation>
+    </message>
+    <message>
+        <source>Database / Memory</source>
+        <translation>Datenbank / Speicher</translation>
+    </message>
+    <message>
+        <source>Legal Information</source>
+        <translation>Rechtliche Hinweise</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>Selbsttest</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDisplayPage</name>
+    <message>
+        <source>Display Settings</source>
+        <translation>Anzeige</translation>
+    </message>
+    <message>
+        <source>Display Brightness</source>
+        <translation>Displayhelligkeit</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsVolumePage</name>
+    <message>
+        <source>Beeper Volume</source>
+        <translation>Signaltonlautstärke</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsLanguagePage</name>
+    <message>
+        <source>Language</source>
+        <translation>Sprache</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDirectoryExplorerPage</name>
+    <message>
+        <source>No files</source>
+        <translation>Keine Dateien</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsFileViewerPage</name>
+    <message>
+        <source>The file can't be shown.</source>
+        <translation>Die Datei kann nicht angezeigt werden.</translation>
+    </message>
+    <message>
+        <source>The file can't be read.</source>
+        <translation>Die Datei kann nicht gelesen werden.</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsSystemInformationPage</name>
+    <message>
+        <source>System Information</source>
+        <translation>Systeminformationen</translation>
+    </message>
+    <message>
+        <source>Restore Factory Settings</source>
+        <translation>Werkseinstellungen</translation>
+    </message>
+    <message>
+        <source>Open Source</source>
+        <translation>Open Source</translation>
+    </message>
+    <message>
+        <source>Burn in BIRCH JuniperX/Juniper</source>
+        <translation>Burn in BIRCH JuniperX/Juniper</translation>
+    </message>
+    <message>
+        <source>Burn in ALDER Larch</source>
+        <translation>Burn in ALDER Larch</translation>
+    </message>
+    <message>
+        <source>Burn in Spruce / Sequoia</source>
+        <translation>Burn in Spruce / Sequoia</translation>
+    </message>
+    <message>
+        <source>Not Configured</source>
+        <translation>Nicht eingerichtet</translation>
+    </message>
+    <message>
+        <source>Instrument Model:</source>
+        <translation>Gerätemodell:</translation>
+    </message>
+    <message>
+        <source>Instrument Serial:</source>
+        <translation>Seriennummer:</translation>
+    </message>
+    <message>
+        <source>Part Number:</source>
+        <translation>Teilenummer:</translation>
+    </message>
+    <message>
+        <source>White Reference Tile:</source>
+        <translation>Weißstandard:</translation>
+    </message>
+    <message>
+        <source>Certification Date:</source>
+        <translation>Zertifizierungsdatum:</translation>
+    </message>
+    <message>
+        <source>Firmware Revision:</source>
+        <translation>Firmware-Version:</translation>
+    </message>
+    <message>
+        <source>Interface Revision:</source>
+        <translation>Oberflächen-Version:</translation>
+    </message>
+    <message>
+        <source>Kernel:</source>
+        <translation>Kernel:</translation>
+    </message>
+    <message>
+        <source>Bootloader:</source>
+        <translation>Bootloader:</translation>
+    </message>
+    <message>
+        <source>Server URL:</source>
+        <translation>Server-URL:</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPowerPage</name>
+    <message>
+        <source>Power</source>
+        <translation>Ein/Aus</translation>
+    </message>
+    <message>
+        <source>Power Off</source>
+        <translation>Ausschalten</translation>
+    </message>
+    <message>
+        <source>Reboot</source>
+        <translation>Neu starten</translation>
+    </message>
+    <message>
+        <source>Shutdown Instrument?</source>
+        <translation>Gerät ausschalten?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to shutdown the instrument?</source>
+        <translation>Möchten Sie das Gerät wirklich ausschalten?</translation>
+    </message>
+    <message>
+        <source>Enter Standby Mode?</source>
+        <translation>In den Standby wechseln?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to put the instrument into standby mode?</source>
+        <translation>Möchten Sie das Gerät wirklich in den Standby versetzen?</translation>
+    </message>
+    <message>
+        <source>Reboot Instrument?</source>
+        <translation>Gerät neu starten?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to reboot the instrument?</source>
+        <translation>Möchten Sie das Gerät wirklich neu starten?</translation>
+    </message>
+    <message>
+        <source>Yes</source>
+        <translation>Ja</translation>
+    </message>
+    <message>
+        <source>No</source>
+        <translation>Nein</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDatabaseMemoryPage</name>
+    <message>
+        <source>Database / Memory</source>
+        <translation>Datenbank / Speicher</translation>
+    </message>
+    <message>
+        <source>Samples</source>
+        <translation>Proben</translation>
+    </message>
+    <message>
+        <source>Jobs</source>
+        <translation>Aufträge</translation>
+    </message>
+    <message>
+        <source>Clear Database</source>
+        <translation>Datenbank löschen</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPowerOptionsPage</name>
+    <message>
+        <source>Power Saving
+Options</source>
+        <translation>Energie-
+sparen</translation>
+    </message>
+    <message>
+        <source>Dim Display</source>
+        <translation>Display abdunkeln</translation>
+    </message>
+    <message>
+        <source>Standby Mode</source>
+        <translation>Standby</translation>
+    </message>
+    <message>
+        <source>Power Off</source>
+        <translation>Ausschalten</translation>
+    </message>
+    <message>
+        <source>Seconds until display dims:</source>
+        <translation>Sekunden bis zum Abdunkeln:</translation>
+    </message>
+    <message>
+        <source>Minutes until standby mode:</source>
+        <translation>Minuten bis Standby:</translation>
+    </message>
+    <message>
+        <source>Minutes until power off:</source>
+        <translation>Minuten bis zum Ausschalten:</translation>
+    </message>
+</context>
+<context>
+    <name>RestoreFactorySettingsPopup</name>
+    <message>
+        <source>Confirm by moving the dot around the circle</source>
+        <translation>Zum Bestätigen den Punkt einmal um den Kreis ziehen</translation>
+    </message>
+    <message>
+        <source>Restore Factory Settings</source>
+        <translation>Werkseinstellungen</translation>
+    </message>
+    <message>
+        <source>All current user settings will go back to defaults. Any jobs or samples will also be lost!</source>
+        <translation>Alle Einstellungen werden zurückgesetzt. Auch alle Aufträge und Proben gehen verloren!</translation>
+    </message>
+</context>
+<context>
+    <name>DeleteAllSamplesPopup</name>
+    <message>
+        <source>Clear Database</source>
+        <translation>Datenbank löschen</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to clear the database, this will delete all samples and jobs from the instrument?</source>
+        <translation>Möchten Sie die Datenbank wirklich löschen? Alle Proben und Aufträge auf dem Gerät werden gelöscht.</translation>
+    </message>
+</context>
+<context>
+    <name>WifiPasswordScreen</name>
+    <message>
+        <source>Password</source>
+        <translation>Passwort</translation>
+    </message>
+    <message>
+        <source>ABC</source>
+        <translation>ABC</translation>
+    </message>
+    <message>
+        <source>@&amp;*</source>
+        <translation>@&amp;*</translation>
+    </message>
+</context>
 </TS>

@@ -583,4 +583,496 @@
         <translation>Send All Jobs To Server</translation>
     </message>
 </context>
+<context>
+    <name>SettingsMainPage</name>
+    <message>
+        <source>Settings</source>
+        <translation>Settings</translation>
+    </message>
+    <message>
+        <source>Valid</source>
+        <translation>Valid</translation>
+    </message>
+    <message>
+        <source>Expired</source>
+        <translation>Expired</translation>
+    </message>
+    <message>
+        <source>Not Connected</source>
+        <translation>Not Connected</translation>
+    </message>
+    <message>
+        <source>%1</source>
+        <translation>%1</translation>
+    </message>
+    <message>
+        <source>%1%</source>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>Power</source>
+        <translation>Power</translation>
+    </message>
+    <message>
+        <source>Language</source>
+        <translation>Language</translation>
+    </message>
+    <message>
+        <source>Calibration</source>
+        <translation>Calibration</translation>
+    </message>
+    <message>
+        <source>Measurement Options</source>
+        <translation>Measurement Options</translation>
+    </message>
+    <message>
+        <source>Wi-Fi</source>
+        <translation>Wi-Fi</translation>
+    </message>
+    <message>
+        <source>Display Settings</source>
+        <translation>Display Settings</translation>
+    </message>
+    <message>
+        <source>Beeper Volume</source>
+        <translation>Beeper Volume</translation>
+    </message>
+    <message>
+        <source>Power Saving Options</source>
+        <translation>Power Saving Options</translation>
+    </message>
+    <message>
+        <source>System &amp; Diagnostics</source>
+        <translation>System &amp; Diagnostics</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsWifiPage</name>
+    <message>
+        <source>Wi-Fi</source>
+        <translation>Wi-Fi</translation>
+    </message>
+    <message>
+        <source>On</source>
+        <translation>On</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>Off</translation>
+    </message>
+    <message>
+        <source>Static IP</source>
+        <translation>Static IP</translation>
+    </message>
+    <message>
+        <source>DHCP</source>
+        <translation>DHCP</translation>
+    </message>
+    <message>
+        <source>Known Networks</source>
+        <translation>Known Networks</translation>
+    </message>
+    <message>
+        <source>Unknown Networks</source>
+        <translation>Unknown Networks</translation>
+    </message>
+    <message>
+        <source>Connection Issue</source>
+        <translation>Connection Issue</translation>
+    </message>
+    <message>
+        <source>Incorrect password</source>
+        <translation>Incorrect password</translation>
+    </message>
+    <message>
+        <source>Network not in range</source>
+        <translation>Network not in range</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsMeasurementPage</name>
+    <message>
+        <source>On</source>
+        <translation>On</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>Off</translation>
+    </message>
+    <message>
+        <source>Measurement Options</source>
+        <translation>Measurement Options</translation>
+    </message>
+    <message>
+        <source>Auto Measurement</source>
+        <translation>Auto Measurement</translation>
+    </message>
+    <message>
+        <source>Time to start auto measurement (sec):</source>
+        <translation>Time to start auto measurement (sec):</translation>
+    </message>
+    <message>
+        <source>Measurement Mode</source>
+        <translation>Measurement Mode</translation>
+    </message>
+    <message>
+        <source>No. of good measurements required:</source>
+        <translation>No. of good measurements required:</translation>
+    </message>
+    <message>
+        <source>Maximum measurements:</source>
+        <translation>Maximum measurements:</translation>
+    </message>
+    <message>
+        <source>Auto Measurements: %1</source>
+        <translation>Auto Measurements: %1</translation>
+    </message>
+    <message>
+        <source>Display LABCH: %1</source>
+        <translation>Display LABCH: %1</translation>
+    </message>
+    <message>
+        <source>Override Pressure Sensors: %1</source>
+        <translation>Override Pressure Sensors: %1</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionSliderItem</name>
+    <message>
+        <source>Never</source>
+        <translation>Never</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionProgressItem</name>
+    <message>
+        <source>%1%</source>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>%1 of %2</source>
+        <translation>%1 of %2</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionPowerInfo</name>
+    <message>
+        <source>%1 hour </source>
+        <translation>%1 hour </translation>
+    </message>
+    <message>
+        <source>%1 hours </source>
+        <translation>%1 hours </translation>
+    </message>
+    <message>
+        <source>%1 minutes and </source>
+        <translation>%1 minutes and </translation>
+    </message>
+    <message>
+        <source>%1 seconds</source>
+        <translation>%1 seconds</translation>
+    </message>
+    <message>
+        <source>Never</source>
+        <translation>Never</translation>
+    </message>
+    <message>
+        <source>Display dims after: %1
+Standby after: %2
+Power off after: %3</source>
+        <translation>Display dims after: %1
+Standby after: %2
+Power off after: %3</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsLegalInformationPage</name>
+    <message>
+        <source>Legal Information</source>
+        <translation>Legal Information</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsSystemAndDiagnosticsPage</name>
+    <message>
+        <source>System &amp;
+Diagnostics</source>
+        <translation>System &amp;
+Diagnostics</translation>
+    </message>
+    <message>
+        <source>System Information</source>
+        <translation>System Information</translation>
+    </message>
+    <message>
+        <source>Database / Memory</source>
+        <translation>Database / Memory</translation>
+    </message>
+    <message>
+        <source>Legal Information</source>
+        <translation>Legal Information</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>Self Test</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDisplayPage</name>
+    <message>
+        <source>Display Settings</source>
+        <translation>Display Settings</translation>
+    </message>
+    <message>
+        <source>Display Brightness</source>
+        <translation>Display Brightness</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsVolumePage</name>
+    <message>
+        <source>Beeper Volume</source>
+        <translation>Beeper Volume</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsLanguagePage</name>
+    <message>
+        <source>Language</source>
+        <translation>Language</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDirectoryExplorerPage</name>
+    <message>
+        <source>No files</source>
+        <translation>No files</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsFileViewerPage</name>
+    <message>
+        <source>The file can't be shown.</source>
+        <translation>The file can't be shown.</translation>
+    </message>
+    <message>
+        <source>The file can't be read.</source>
+        <translation>The file can't be read.</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsSystemInformationPage</name>
+    <message>
+        <source>System Information</source>
+        <translation>System Information</translation>
+    </message>
+    <message>
+        <source>Restore Factory Settings</source>
+        <translation>Restore Factory Settings</translation>
+    </message>
+    <message>
+        <source>Open Source</source>
+        <translation>Open Source</translation>
+    </message>
+    <message>
+        <source>Burn in BIRCH JuniperX/Juniper</source>
+        <translation>Burn in BIRCH JuniperX/Juniper</translation>
+    </message>
+    <message>
+        <source>Burn in ALDER Larch</source>
+        <translation>Burn in ALDER Larch</translation>
+    </message>
+    <message>
+        <source>Burn in Spruce / Sequoia</source>
+        <translation>Burn in Spruce / Sequoia</translation>
+    </message>
+    <message>
+        <source>Not Configured</source>
+        <translation>Not Configured</translation>
+    </message>
+    <message>
+        <source>Instrument Model:</source>
+        <translation>Instrument Model:</translation>
+    </message>
+    <message>
+        <source>Instrument Serial:</source>
+        <translation>Instrument Serial:</translation>
+    </message>
+    <message>
+        <source>Part Number:</source>
+        <translation>Part Number:</translation>
+    </message>
+    <message>
+        <source>White Reference Tile:</source>
+        <translation>White Reference Tile:</translation>
+    </message>
+    <message>
+        <source>Certification Date:</source>
+        <translation>Certification Date:</translation>
+    </message>
+    <message>
+        <source>Firmware Revision:</source>
+        <translation>Firmware Revision:</translation>
+    </message>
+    <message>
+        <source>Interface Revision:</source>
+        <translation>Interface Revision:</translation>
+    </message>
+    <message>
+        <source>Kernel:</source>
+        <translation>Kernel:</translation>
+    </message>
+    <message>
+        <source>Bootloader:</source>
+        <translation>Bootloader:</translation>
+    </message>
+    <message>
+        <source>Server URL:</source>
+        <translation>Server URL:</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPowerPage</name>
+    <message>
+        <source>Power</source>
+        <translation>Power</translation>
+    </message>
+    <message>
+        <source>Power Off</source>
+        <translation>Power Off</translation>
+    </message>
+    <message>
+        <source>Reboot</source>
+        <translation>Reboot</translation>
+    </message>
+    <message>
+        <source>Shutdown Instrument?</source>
+        <translation>Shutdown Instrument?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to shutdown the instrument?</source>
+        <translation>Are you sure you want to shutdown the instrument?</translation>
+    </message>
+    <message>
+        <source>Enter Standby Mode?</source>
+        <translation>Enter Standby Mode?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to put the instrument into standby mode?</source>
+        <translation>Are you sure you want to put the instrument into standby mode?</translation>
+    </message>
+    <message>
+        <source>Reboot Instrument?</source>
+        <translation>Reboot Instrument?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to reboot the instrument?</source>
+        <translation>Are you sure you want to reboot the instrument?</translation>
+    </message>
+    <message>
+        <source>Yes</source>
+        <translation>Yes</translation>
+    </message>
+    <message>
+        <source>No</source>
+        <translation>No</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDatabaseMemoryPage</name>
+    <message>
+        <source>Database / Memory</source>
+        <translation>Database / Memory</translation>
+    </message>
+    <message>
+        <source>Samples</source>
+        <translation>Samples</translation>
+    </message>
+    <message>
+        <source>Jobs</source>
+        <translation>Jobs</translation>
+    </message>
+    <message>
+        <source>Clear Database</source>
+        <translation>Clear Database</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPowerOptionsPage</name>
+    <message>
+        <source>Power Saving
+Options</source>
+        <translation>Power Saving
+Options</translation>
+    </message>
+    <message>
+        <source>Dim Display</source>
+        <translation>Dim Display</translation>
+    </message>
+    <message>
+        <source>Standby Mode</source>
+        <translation>Standby Mode</translation>
+    </message>
+    <message>
+        <source>Power Off</source>
+        <translation>Power Off</translation>
+    </message>
+    <message>
+        <source>Seconds until display dims:</source>
+        <translation>Seconds until display dims:</translation>
+    </message>
+    <message>
+        <source>Minutes until standby mode:</source>
+        <translation>Minutes until standby mode:</translation>
+    </message>
+    <message>
+        <source>Minutes until power off:</source>
+        <translation>Minutes until power off:</translation>
+    </message>
+</context>
+<context>
+    <name>RestoreFactorySettingsPopup</name>
+    <message>
+        <source>Confirm by moving the dot around the circle</source>
+        <translation>Confirm by moving the dot around the circle</translation>
+    </message>
+    <message>
+        <source>Restore Factory Settings</source>
+        <translation>Restore Factory Settings</translation>
+    </message>
+    <message>
+        <source>All current user settings will go back to defaults. Any jobs or samples will also be lost!</source>
+        <translation>All current user settings will go back to defaults. Any jobs or samples will also be lost!</translation>
+    </message>
+</context>
+<context>
+    <name>DeleteAllSamplesPopup</name>
+    <message>
+        <source>Clear Database</source>
+        <translation>Clear Database</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to clear the database, this will delete all samples and jobs from the instrument?</source>
+        <translation>Are you sure you want to clear the database, this will delete all samples and jobs from the instrument?</translation>
+    </message>
+</context>
+<context>
+    <name>WifiPasswordScreen</name>
+    <message>
+        <source>Password</source>
+        <translation>Password</translation>
+    </message>
+    <message>
+        <source>ABC</source>
+        <translation>ABC</translation>
+    </message>
+    <message>
+        <source>@&amp;*</source>
+        <translation>@&amp;*</translation>
+    </message>
+</context>
 </TS>

@@ -583,4 +583,496 @@
         <translation>Enviar todos los trabajos al servidor</translation>
     </message>
 </context>
+<context>
+    <name>SettingsMainPage</name>
+    <message>
+        <source>Settings</source>
+        <translation>Ajustes</translation>
+    </message>
+    <message>
+        <source>Valid</source>
+        <translation>Válida</translation>
+    </message>
+    <message>
+        <source>Expired</source>
+        <translation>Caducada</translation>
+    </message>
+    <message>
+        <source>Not Connected</source>
+        <translation>No conectado</translation>
+    </message>
+    <message>
+        <source>%1</source>
+        <translation>%1</translation>
+    </message>
+    <message>
+        <source>%1%</source>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>Power</source>
+        <translation>Encendido</translation>
+    </message>
+    <message>
+        <source>Language</source>
+        <translation>Idioma</translation>
+    </message>
+    <message>
+        <source>Calibration</source>
+        <translation>Calibración</translation>
+    </message>
+    <message>
+        <source>Measurement Options</source>
+        <translation>Opciones de medición</translation>
+    </message>
+    <message>
+        <source>Wi-Fi</source>
+        <translation>Wi-Fi</translation>
+    </message>
+    <message>
+        <source>Display Settings</source>
+        <translation>Pantalla</translation>
+    </message>
+    <message>
+        <source>Beeper Volume</source>
+        <translation>Volumen del pitido</translation>
+    </message>
+    <message>
+        <source>Power Saving Options</source>
+        <translation>Ahorro de energía</translation>
+    </message>
+    <message>
+        <source>System &amp; Diagnostics</source>
+        <translation>Sistema y diagnóstico</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsWifiPage</name>
+    <message>
+        <source>Wi-Fi</source>
+        <translation>Wi-Fi</translation>
+    </message>
+    <message>
+        <source>On</source>
+        <translation>Activado</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>Desactivado</translation>
+    </message>
+    <message>
+        <source>Static IP</source>
+        <translation>IP estática</translation>
+    </message>
+    <message>
+        <source>DHCP</source>
+        <translation>DHCP</translation>
+    </message>
+    <message>
+        <source>Known Networks</source>
+        <translation>Redes conocidas</translation>
+    </message>
+    <message>
+        <source>Unknown Networks</source>
+        <translation>Redes disponibles</translation>
+    </message>
+    <message>
+        <source>Connection Issue</source>
+        <translation>Problema de conexión</translation>
+    </message>
+    <message>
+        <source>Incorrect password</source>
+        <translation>Contraseña incorrecta</translation>
+    </message>
+    <message>
+        <source>Network not in range</source>
+        <translation>Red fuera de alcance</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>Aceptar</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsMeasurementPage</name>
+    <message>
+        <source>On</source>
+        <translation>Activado</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>Desactivado</translation>
+    </message>
+    <message>
+        <source>Measurement Options</source>
+        <translation>Opciones de medición</translation>
+    </message>
+    <message>
+        <source>Auto Measurement</source>
+        <translation>Medición automática</translation>
+    </message>
+    <message>
+        <source>Time to start auto measurement (sec):</source>
+        <translation>Tiempo hasta la medición automática (s):</translation>
+    </message>
+    <message>
+        <source>Measurement Mode</source>
+        <translation>Modo de medición</translation>
+    </message>
+    <message>
+        <source>No. of good measurements required:</source>
+        <translation>N.º de mediciones válidas necesarias:</translation>
+    </message>
+    <message>
+        <source>Maximum measurements:</source>
+        <translation>Mediciones máximas:</translation>
+    </message>
+    <message>
+        <source>Auto Measurements: %1</source>
+        <translation>Mediciones automáticas: %1</translation>
+    </message>
+    <message>
+        <source>Display LABCH: %1</source>
+        <translation>Mostrar LABCH: %1</translation>
+    </message>
+    <message>
+        <source>Override Pressure Sensors: %1</source>
+        <translation>Ignorar sensores de presión: %1</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionSliderItem</name>
+    <message>
+        <source>Never</source>
+        <translation>Nunca</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionProgressItem</name>
+    <message>
+        <source>%1%</source>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>%1 of %2</source>
+        <translation>%1 de %2</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionPowerInfo</name>
+    <message>
+        <source>%1 hour </source>
+        <translation>%1 hora </translation>
+    </message>
+    <message>
+        <source>%1 hours </source>
+        <translation>%1 horas </translation>
+    </message>
+    <message>
+        <source>%1 minutes and </source>
+        <translation>%1 minutos y </translation>
+    </message>
+    <message>
+        <source>%1 seconds</source>
+        <translation>%1 segundos</translation>
+    </message>
+    <message>
+        <source>Never</source>
+        <translation>Nunca</translation>
+    </message>
+    <message>
+        <source>Display dims after: %1
+Standby after: %2
+Power off after: %3</source>
+        <translation>Atenuación tras: %1
+Reposo tras: %2
+Apagado tras: %3</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsLegalInformationPage</name>
+    <message>
+        <source>Legal Information</source>
+        <translation>Información legal</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsSystemAndDiagnosticsPage</name>
+    <message>
+        <source>System &amp;
+Diagnostics</source>
+        <translation>Sistema y
+diagnóstico</translation>
+    </message>
+    <message>
+        <source>System Information</source>
+        <translation>Información del sistema</translation>
+    </message>
+    <message>
+        <source>Database / Memory</source>
+        <translation>Base de datos / memoria</translation>
+    </message>
+    <message>
+        <source>Legal Information</source>
+        <translation>Información legal</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>Autoprueba</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDisplayPage</name>
+    <message>
+        <source>Display Settings</source>
+        <translation>Pantalla</translation>
+    </message>
+    <message>
+        <source>Display Brightness</source>
+        <translation>Brillo de pantalla</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsVolumePage</name>
+    <message>
+        <source>Beeper Volume</source>
+        <translation>Volumen del pitido</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsLanguagePage</name>
+    <message>
+        <source>Language</source>
+        <translation>Idioma</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDirectoryExplorerPage</name>
+    <message>
+        <source>No files</source>
+        <translation>Sin archivos</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsFileViewerPage</name>
+    <message>
+        <source>The file can't be shown.</source>
+        <translation>No se puede mostrar el archivo.</translation>
+    </message>
+    <message>
+        <source>The file can't be read.</source>
+        <translation>No se puede leer el archivo.</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsSystemInformationPage</name>
+    <message>
+        <source>System Information</source>
+        <translation>Información del sistema</translation>
+    </message>
+    <message>
+        <source>Restore Factory Settings</source>
+        <translation>Restaurar ajustes de fábrica</translation>
+    </message>
+    <message>
+        <source>Open Source</source>
+        <translation>Código abierto</translation>
+    </message>
+    <message>
+        <source>Burn in BIRCH JuniperX/Juniper</source>
+        <translation>Burn in BIRCH JuniperX/Juniper</translation>
+    </message>
+    <message>
+        <source>Burn in ALDER Larch</source>
+        <translation>Burn in ALDER Larch</translation>
+    </message>
+    <message>
+        <source>Burn in Spruce / Sequoia</source>
+        <translation>Burn in Spruce / Sequoia</translation>
+    </message>
+    <message>
+        <source>Not Configured</source>
+        <translation>No configurado</translation>
+    </message>
+    <message>
+        <source>Instrument Model:</source>
+        <translation>Modelo:</translation>
+    </message>
+    <message>
+        <source>Instrument Serial:</source>
+        <translation>N.º de serie:</translation>
+    </message>
+    <message>
+        <source>Part Number:</source>
+        <translation>Referencia:</translation>
+    </message>
+    <message>
+        <source>White Reference Tile:</source>
+        <translation>Patrón blanco:</translation>
+    </message>
+    <message>
+        <source>Certification Date:</source>
+        <translation>Fecha de certificación:</translation>
+    </message>
+    <message>
+        <source>Firmware Revision:</source>
+        <translation>Versión de firmware:</translation>
+    </message>
+    <message>
+        <source>Interface Revision:</source>
+        <translation>Versión de la interfaz:</translation>
+    </message>
+    <message>
+        <source>Kernel:</source>
+        <translation>Kernel:</translation>
+    </message>
+    <message>
+        <source>Bootloader:</source>
+        <translation>Bootloader:</translation>
+    </message>
+    <message>
+        <source>Server URL:</source>
+        <translation>URL del servidor:</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPowerPage</name>
+    <message>
+        <source>Power</source>
+        <translation>Encendido</translation>
+    </message>
+    <message>
+        <source>Power Off</source>
+        <translation>Apagar</translation>
+    </message>
+    <message>
+        <source>Reboot</source>
+        <translation>Reiniciar</translation>
+    </message>
+    <message>
+        <source>Shutdown Instrument?</source>
+        <translation>¿Apagar el instrumento?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to shutdown the instrument?</source>
+        <translation>¿Seguro que desea apagar el instrumento?</translation>
+    </message>
+    <message>
+        <source>Enter Standby Mode?</source>
+        <translation>¿Pasar a reposo?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to put the instrument into standby mode?</source>
+        <translation>¿Seguro que desea poner el instrumento en reposo?</translation>
+    </message>
+    <message>
+        <source>Reboot Instrument?</source>
+        <translation>¿Reiniciar el instrumento?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to reboot the instrument?</source>
+        <translation>¿Seguro que desea reiniciar el instrumento?</translation>
+    </message>
+    <message>
+        <source>Yes</source>
+        <translation>Sí</translation>
+    </message>
+    <message>
+        <source>No</source>
+        <translation>No</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDatabaseMemoryPage</name>
+    <message>
+        <source>Database / Memory</source>
+        <translation>Base de datos / memoria</translation>
+    </message>
+    <message>
+        <source>Samples</source>
+        <translation>Muestras</translation>
+    </message>
+    <message>
+        <source>Jobs</source>
+        <translation>Trabajos</translation>
+    </message>
+    <message>
+        <source>Clear Database</source>
+        <translation>Borrar base de datos</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPowerOptionsPage</name>
+    <message>
+        <source>Power Saving
+Options</source>
+        <translation>Ahorro de
+energía</translation>
+    </message>
+    <message>
+        <source>Dim Display</source>
+        <translation>Atenuar pantalla</translation>
+    </message>
+    <message>
+        <source>Standby Mode</source>
+        <translation>Modo de reposo</translation>
+    </message>
+    <message>
+        <source>Power Off</source>
+        <translation>Apagar</translation>
+    </message>
+    <message>
+        <source>Seconds until display dims:</source>
+        <translation>Segundos hasta atenuar la pantalla:</translation>
+    </message>
+    <message>
+        <source>Minutes until standby mode:</source>
+        <translation>Minutos hasta el reposo:</translation>
+    </message>
+    <message>
+        <source>Minutes until power off:</source>
+        <translation>Minutos hasta apagarse:</translation>
+    </message>
+</context>
+<context>
+    <name>RestoreFactorySettingsPopup</name>
+    <message>
+        <source>Confirm by moving the dot around the circle</source>
+        <translation>Confirme girando el punto alrededor del círculo</translation>
+    </message>
+    <message>
+        <source>Restore Factory Settings</source>
+        <translation>Restaurar ajustes de fábrica</translation>
+    </message>
+    <message>
+        <source>All current user settings will go back to defaults. Any jobs or samples will also be lost!</source>
+        <translation>Todos los ajustes volverán a sus valores predeterminados. ¡También se perderán los trabajos y las muestras!</translation>
+    </message>
+</context>
+<context>
+    <name>DeleteAllSamplesPopup</name>
+    <message>
+        <source>Clear Database</source>
+        <translation>Borrar base de datos</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to clear the database, this will delete all samples and jobs from the instrument?</source>
+        <translation>¿Seguro que desea borrar la base de datos? Se eliminarán todas las muestras y todos los trabajos del instrumento.</translation>
+    </message>
+</context>
+<context>
+    <name>WifiPasswordScreen</name>
+    <message>
+        <source>Password</source>
+        <translation>Contraseña</translation>
+    </message>
+    <message>
+        <source>ABC</source>
+        <translation>ABC</translation>
+    </message>
+    <message>
+        <source>@&amp;*</source>
+        <translation>@&amp;*</translation>
+    </message>
+</context>
 </TS>

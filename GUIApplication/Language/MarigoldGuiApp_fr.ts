@@ -583,4 +583,496 @@
         <translation>Envoyer tous les travaux au serveur</translation>
     </message>
 </context>
+<context>
+    <name>SettingsMainPage</name>
+    <message>
+        <source>Settings</source>
+        <translation>Paramètres</translation>
+    </message>
+    <message>
+        <source>Valid</source>
+        <translation>Valide</translation>
+    </message>
+    <message>
+        <source>Expired</source>
+        <translation>Expirée</translation>
+    </message>
+    <message>
+        <source>Not Connected</source>
+        <translation>Non connecté</translation>
+    </message>
+    <message>
+        <source>%1</source>
+        <translation>%1</translation>
+    </message>
+    <message>
+        <source>%1%</source>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>Power</source>
+        <translation>Alimentation</translation>
+    </message>
+    <message>
+        <source>Language</source>
+        <translation>Langue</translation>
+    </message>
+    <message>
+        <source>Calibration</source>
+        <translation>Étalonnage</translation>
+    </message>
+    <message>
+        <source>Measurement Options</source>
+        <translation>Options de mesure</translation>
+    </message>
+    <message>
+        <source>Wi-Fi</source>
+        <translation>Wi-Fi</translation>
+    </message>
+    <message>
+        <source>Display Settings</source>
+        <translation>Affichage</translation>
+    </message>
+    <message>
+        <source>Beeper Volume</source>
+        <translation>Volume du bip</translation>
+    </message>
+    <message>
+        <source>Power Saving Options</source>
+        <translation>Économie d'énergie</translation>
+    </message>
+    <message>
+        <source>System &amp; Diagnostics</source>
+        <translation>Système et diagnostic</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsWifiPage</name>
+    <message>
+        <source>Wi-Fi</source>
+        <translation>Wi-Fi</translation>
+    </message>
+    <message>
+        <source>On</source>
+        <translation>Activé</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>Désactivé</translation>
+    </message>
+    <message>
+        <source>Static IP</source>
+        <translation>IP statique</translation>
+    </message>
+    <message>
+        <source>DHCP</source>
+        <translation>DHCP</translation>
+    </message>
+    <message>
+        <source>Known Networks</source>
+        <translation>Réseaux connus</translation>
+    </message>
+    <message>
+        <source>Unknown Networks</source>
+        <translation>Réseaux disponibles</translation>
+    </message>
+    <message>
+        <source>Connection Issue</source>
+        <translation>Problème de connexion</translation>
+    </message>
+    <message>
+        <source>Incorrect password</source>
+        <translation>Mot de passe incorrect</translation>
+    </message>
+    <message>
+        <source>Network not in range</source>
+        <translation>Réseau hors de portée</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsMeasurementPage</name>
+    <message>
+        <source>On</source>
+        <translation>Activé</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>Désactivé</translation>
+    </message>
+    <message>
+        <source>Measurement Options</source>
+        <translation>Options de mesure</translation>
+    </message>
+    <message>
+        <source>Auto Measurement</source>
+        <translation>Mesure automatique</translation>
+    </message>
+    <message>
+        <source>Time to start auto measurement (sec):</source>
+        <translation>Délai avant la mesure automatique (s) :</translation>
+    </message>
+    <message>
+        <source>Measurement Mode</source>
+        <translation>Mode de mesure</translation>
+    </message>
+    <message>
+        <source>No. of good measurements required:</source>
+        <translation>Nombre de mesures valides requises :</translation>
+    </message>
+    <message>
+        <source>Maximum measurements:</source>
+        <translation>Nombre maximal de mesures :</translation>
+    </message>
+    <message>
+        <source>Auto Measurements: %1</source>
+        <translation>Mesures automatiques : %1</translation>
+    </message>
+    <message>
+        <source>Display LABCH: %1</source>
+        <translation>Afficher LABCH : %1</translation>
+    </message>
+    <message>
+        <source>Override Pressure Sensors: %1</source>
+        <translation>Ignorer les capteurs de pression : %1</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionSliderItem</name>
+    <message>
+        <source>Never</source>
+        <translation>Jamais</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionProgressItem</name>
+    <message>
+        <source>%1%</source>
+        <translation>%1 %</translation>
+    </message>
+    <message>
+        <source>%1 of %2</source>
+        <translation>%1 sur %2</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionPowerInfo</name>
+    <message>
+        <source>%1 hour </source>
+        <translation>%1 heure </translation>
+    </message>
+    <message>
+        <source>%1 hours </source>
+        <translation>%1 heures </translation>
+    </message>
+    <message>
+        <source>%1 minutes and </source>
+        <translation>%1 minutes et </translation>
+    </message>
+    <message>
+        <source>%1 seconds</source>
+        <translation>%1 secondes</translation>
+    </message>
+    <message>
+        <source>Never</source>
+        <translation>Jamais</translation>
+    </message>
+    <message>
+        <source>Display dims after: %1
+Standby after: %2
+Power off after: %3</source>
+        <translation>Atténuation après : %1
+Veille après : %2
+Arrêt après : %3</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsLegalInformationPage</name>
+    <message>
+        <source>Legal Information</source>
+        <translation>Informations légales</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsSystemAndDiagnosticsPage</name>
+    <message>
+        <source>System &amp;
+Diagnostics</source>
+        <translation>Système et
+diagnostic</translation>
+    </message>
+    <message>
+        <source>System Information</source>
+        <translation>Informations système</translation>
+    </message>
+    <message>
+        <source>Database / Memory</source>
+        <translation>Base de données / mémoire</translation>
+    </message>
+    <message>
+        <source>Legal Information</source>
+        <translation>Informations légales</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>Autotest</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDisplayPage</name>
+    <message>
+        <source>Display Settings</source>
+        <translation>Affichage</translation>
+    </message>
+    <message>
+        <source>Display Brightness</source>
+        <translation>Luminosité de l'écran</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsVolumePage</name>
+    <message>
+        <source>Beeper Volume</source>
+        <translation>Volume du bip</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsLanguagePage</name>
+    <message>
+        <source>Language</source>
+        <translation>Langue</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDirectoryExplorerPage</name>
+    <message>
+        <source>No files</source>
+        <translation>Aucun fichier</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsFileViewerPage</name>
+    <message>
+        <source>The file can't be shown.</source>
+        <translation>Impossible d'afficher le fichier.</translation>
+    </message>
+    <message>
+        <source>The file can't be read.</source>
+        <translation>Impossible de lire le fichier.</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsSystemInformationPage</name>
+    <message>
+        <source>System Information</source>
+        <translation>Informations système</translation>
+    </message>
+    <message>
+        <source>Restore Factory Settings</source>
+        <translation>Rétablir les paramètres d'usine</translation>
+    </message>
+    <message>
+        <source>Open Source</source>
+        <translation>Logiciels libres</translation>
+    </message>
+    <message>
+        <source>Burn in BIRCH JuniperX/Juniper</source>
+        <translation>Burn in BIRCH JuniperX/Juniper</translation>
+    </message>
+    <message>
+        <source>Burn in ALDER Larch</source>
+        <translation>Burn in ALDER Larch</translation>
+    </message>
+    <message>
+        <source>Burn in Spruce / Sequoia</source>
+        <translation>Burn in Spruce / Sequoia</translation>
+    </message>
+    <message>
+        <source>Not Configured</source>
+        <translation>Non configuré</translation>
+    </message>
+    <message>
+        <source>Instrument Model:</source>
+        <translation>Modèle :</translation>
+    </message>
+    <message>
+        <source>Instrument Serial:</source>
+        <translation>N° de série :</translation>
+    </message>
+    <message>
+        <source>Part Number:</source>
+        <translation>Référence :</translation>
+    </message>
+    <message>
+        <source>White Reference Tile:</source>
+        <translation>Étalon blanc :</translation>
+    </message>
+    <message>
+        <source>Certification Date:</source>
+        <translation>Date de certification :</translation>
+    </message>
+    <message>
+        <source>Firmware Revision:</source>
+        <translation>Version du micrologiciel :</translation>
+    </message>
+    <message>
+        <source>Interface Revision:</source>
+        <translation>Version de l'interface :</translation>
+    </message>
+    <message>
+        <source>Kernel:</source>
+        <translation>Noyau :</translation>
+    </message>
+    <message>
+        <source>Bootloader:</source>
+        <translation>Chargeur d'amorçage :</translation>
+    </message>
+    <message>
+        <source>Server URL:</source>
+        <translation>URL du serveur :</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPowerPage</name>
+    <message>
+        <source>Power</source>
+        <translation>Alimentation</translation>
+    </message>
+    <message>
+        <source>Power Off</source>
+        <translation>Éteindre</translation>
+    </message>
+    <message>
+        <source>Reboot</source>
+        <translation>Redémarrer</translation>
+    </message>
+    <message>
+        <source>Shutdown Instrument?</source>
+        <translation>Éteindre l'instrument ?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to shutdown the instrument?</source>
+        <translation>Voulez-vous vraiment éteindre l'instrument ?</translation>
+    </message>
+    <message>
+        <source>Enter Standby Mode?</source>
+        <translation>Passer en veille ?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to put the instrument into standby mode?</source>
+        <translation>Voulez-vous vraiment mettre l'instrument en veille ?</translation>
+    </message>
+    <message>
+        <source>Reboot Instrument?</source>
+        <translation>Redémarrer l'instrument ?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to reboot the instrument?</source>
+        <translation>Voulez-vous vraiment redémarrer l'instrument ?</translation>
+    </message>
+    <message>
+        <source>Yes</source>
+        <translation>Oui</translation>
+    </message>
+    <message>
+        <source>No</source>
+        <translation>Non</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDatabaseMemoryPage</name>
+    <message>
+        <source>Database / Memory</source>
+        <translation>Base de données / mémoire</translation>
+    </message>
+    <message>
+        <source>Samples</source>
+        <translation>Échantillons</translation>
+    </message>
+    <message>
+        <source>Jobs</source>
+        <translation>Travaux</translation>
+    </message>
+    <message>
+        <source>Clear Database</source>
+        <translation>Effacer la base de données</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPowerOptionsPage</name>
+    <message>
+        <source>Power Saving
+Options</source>
+        <translation>Économie
+d'énergie</translation>
+    </message>
+    <message>
+        <source>Dim Display</source>
+        <translation>Atténuer l'écran</translation>
+    </message>
+    <message>
+        <source>Standby Mode</source>
+        <translation>Mode veille</translation>
+    </message>
+    <message>
+        <source>Power Off</source>
+        <translation>Éteindre</translation>
+    </message>
+    <message>
+        <source>Seconds until display dims:</source>
+        <translation>Secondes avant atténuation :</translation>
+    </message>
+    <message>
+        <source>Minutes until standby mode:</source>
+        <translation>Minutes avant la veille :</translation>
+    </message>
+    <message>
+        <source>Minutes until power off:</source>
+        <translation>Minutes avant l'arrêt :</translation>
+    </message>
+</context>
+<context>
+    <name>RestoreFactorySettingsPopup</name>
+    <message>
+        <source>Confirm by moving the dot around the circle</source>
+        <translation>Confirmez en faisant le tour du cercle avec le point</translation>
+    </message>
+    <message>
+        <source>Restore Factory Settings</source>
+        <translation>Rétablir les paramètres d'usine</translation>
+    </message>
+    <message>
+        <source>All current user settings will go back to defaults. Any jobs or samples will also be lost!</source>
+        <translation>Tous les paramètres reviendront aux valeurs par défaut. Les travaux et les échantillons seront également perdus !</translation>
+    </message>
+</context>
+<context>
+    <name>DeleteAllSamplesPopup</name>
+    <message>
+        <source>Clear Database</source>
+        <translation>Effacer la base de données</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to clear the database, this will delete all samples and jobs from the instrument?</source>
+        <translation>Voulez-vous vraiment effacer la base de données ? Tous les échantillons et travaux de l'instrument seront supprimés.</translation>
+    </message>
+</context>
+<context>
+    <name>WifiPasswordScreen</name>
+    <message>
+        <source>Password</source>
+        <translation>Mot de passe</translation>
+    </message>
+    <message>
+        <source>ABC</source>
+        <translation>ABC</translation>
+    </message>
+    <message>
+        <source>@&amp;*</source>
+        <translation>@&amp;*</translation>
+    </message>
+</context>
 </TS>

@@ -583,4 +583,496 @@
         <translation>Invia tutti i lavori al server</translation>
     </message>
 </context>
+<context>
+    <name>SettingsMainPage</name>
+    <message>
+        <source>Settings</source>
+        <translation>Impostazioni</translation>
+    </message>
+    <message>
+        <source>Valid</source>
+        <translation>Valida</translation>
+    </message>
+    <message>
+        <source>Expired</source>
+        <translation>Scaduta</translation>
+    </message>
+    <message>
+        <source>Not Connected</source>
+        <translation>Non connesso</translation>
+    </message>
+    <message>
+        <source>%1</source>
+        <translation>%1</translation>
+    </message>
+    <message>
+        <source>%1%</source>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>Power</source>
+        <translation>Alimentazione</translation>
+    </message>
+    <message>
+        <source>Language</source>
+        <translation>Lingua</translation>
+    </message>
+    <message>
+        <source>Calibration</source>
+        <translation>Calibrazione</translation>
+    </message>
+    <message>
+        <source>Measurement Options</source>
+        <translation>Opzioni di misura</translation>
+    </message>
+    <message>
+        <source>Wi-Fi</source>
+        <translation>Wi-Fi</translation>
+    </message>
+    <message>
+        <source>Display Settings</source>
+        <translation>Display</translation>
+    </message>
+    <message>
+        <source>Beeper Volume</source>
+        <translation>Volume segnale acustico</translation>
+    </message>
+    <message>
+        <source>Power Saving Options</source>
+        <translation>Risparmio energetico</translation>
+    </message>
+    <message>
+        <source>System &amp; Diagnostics</source>
+        <translation>Sistema e diagnostica</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsWifiPage</name>
+    <message>
+        <source>Wi-Fi</source>
+        <translation>Wi-Fi</translation>
+    </message>
+    <message>
+        <source>On</source>
+        <translation>Attivo</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>Disattivo</translation>
+    </message>
+    <message>
+        <source>Static IP</source>
+        <translation>IP statico</translation>
+    </message>
+    <message>
+        <source>DHCP</source>
+        <translation>DHCP</translation>
+    </message>
+    <message>
+        <source>Known Networks</source>
+        <translation>Reti note</translation>
+    </message>
+    <message>
+        <source>Unknown Networks</source>
+        <translation>Reti disponibili</translation>
+    </message>
+    <message>
+        <source>Connection Issue</source>
+        <translation>Problema di connessione</translation>
+    </message>
+    <message>
+        <source>Incorrect password</source>
+        <translation>Password errata</translation>
+    </message>
+    <message>
+        <source>Network not in range</source>
+        <translation>Rete fuori portata</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsMeasurementPage</name>
+    <message>
+        <source>On</source>
+        <translation>Attivo</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>Disattivo</translation>
+    </message>
+    <message>
+        <source>Measurement Options</source>
+        <translation>Opzioni di misura</translation>
+    </message>
+    <message>
+        <source>Auto Measurement</source>
+        <translation>Misura automatica</translation>
+    </message>
+    <message>
+        <source>Time to start auto measurement (sec):</source>
+        <translation>Tempo prima della misura automatica (s):</translation>
+    </message>
+    <message>
+        <source>Measurement Mode</source>
+        <translation>Modalità di misura</translation>
+    </message>
+    <message>
+        <source>No. of good measurements required:</source>
+        <translation>N. di misure valide richieste:</translation>
+    </message>
+    <message>
+        <source>Maximum measurements:</source>
+        <translation>Numero massimo di misure:</translation>
+    </message>
+    <message>
+        <source>Auto Measurements: %1</source>
+        <translation>Misure automatiche: %1</translation>
+    </message>
+    <message>
+        <source>Display LABCH: %1</source>
+        <translation>Mostra LABCH: %1</translation>
+    </message>
+    <message>
+        <source>Override Pressure Sensors: %1</source>
+        <translation>Ignora sensori di pressione: %1</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionSliderItem</name>
+    <message>
+        <source>Never</source>
+        <translation>Mai</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionProgressItem</name>
+    <message>
+        <source>%1%</source>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>%1 of %2</source>
+        <translation>%1 di %2</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionPowerInfo</name>
+    <message>
+        <source>%1 hour </source>
+        <translation>%1 ora </translation>
+    </message>
+    <message>
+        <source>%1 hours </source>
+        <translation>%1 ore </translation>
+    </message>
+    <message>
+        <source>%1 minutes and </source>
+        <translation>%1 minuti e </translation>
+    </message>
+    <message>
+        <source>%1 seconds</source>
+        <translation>%1 secondi</translation>
+    </message>
+    <message>
+        <source>Never</source>
+        <translation>Mai</translation>
+    </message>
+    <message>
+        <source>Display dims after: %1
+Standby after: %2
+Power off after: %3</source>
+        <translation>Attenuazione dopo: %1
+Standby dopo: %2
+Spegnimento dopo: %3</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsLegalInformationPage</name>
+    <message>
+        <source>Legal Information</source>
+        <translation>Informazioni legali</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsSystemAndDiagnosticsPage</name>
+    <message>
+        <source>System &amp;
+Diagnostics</source>
+        <translation>Sistema e
+diagnostica</translation>
+    </message>
+    <message>
+        <source>System Information</source>
+        <translation>Informazioni di sistema</translation>
+    </message>
+    <message>
+        <source>Database / Memory</source>
+        <translation>Database / memoria</translation>
+    </message>
+    <message>
+        <source>Legal Information</source>
+        <translation>Informazioni legali</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>Autotest</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDisplayPage</name>
+    <message>
+        <source>Display Settings</source>
+        <translation>Display</translation>
+    </message>
+    <message>
+        <source>Display Brightness</source>
+        <translation>Luminosità display</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsVolumePage</name>
+    <message>
+        <source>Beeper Volume</source>
+        <translation>Volume segnale acustico</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsLanguagePage</name>
+    <message>
+        <source>Language</source>
+        <translation>Lingua</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDirectoryExplorerPage</name>
+    <message>
+        <source>No files</source>
+        <translation>Nessun file</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsFileViewerPage</name>
+    <message>
+        <source>The file can't be shown.</source>
+        <translation>Impossibile mostrare il file.</translation>
+    </message>
+    <message>
+        <source>The file can't be read.</source>
+        <translation>Impossibile leggere il file.</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsSystemInformationPage</name>
+    <message>
+        <source>System Information</source>
+        <translation>Informazioni di sistema</translation>
+    </message>
+    <message>
+        <source>Restore Factory Settings</source>
+        <translation>Ripristina impostazioni di fabbrica</translation>
+    </message>
+    <message>
+        <source>Open Source</source>
+        <translation>Open source</translation>
+    </message>
+    <message>
+        <source>Burn in BIRCH JuniperX/Juniper</source>
+        <translation>Burn in BIRCH JuniperX/Juniper</translation>
+    </message>
+    <message>
+        <source>Burn in ALDER Larch</source>
+        <translation>Burn in ALDER Larch</translation>
+    </message>
+    <message>
+        <source>Burn in Spruce / Sequoia</source>
+        <translation>Burn in Spruce / Sequoia</translation>
+    </message>
+    <message>
+        <source>Not Configured</source>
+        <translation>Non configurato</translation>
+    </message>
+    <message>
+        <source>Instrument Model:</source>
+        <translation>Modello:</translation>
+    </message>
+    <message>
+        <source>Instrument Serial:</source>
+        <translation>Numero di serie:</translation>
+    </message>
+    <message>
+        <source>Part Number:</source>
+        <translation>Codice articolo:</translation>
+    </message>
+    <message>
+        <source>White Reference Tile:</source>
+        <translation>Piastrella bianca:</translation>
+    </message>
+    <message>
+        <source>Certification Date:</source>
+        <translation>Data di certificazione:</translation>
+    </message>
+    <message>
+        <source>Firmware Revision:</source>
+        <translation>Versione firmware:</translation>
+    </message>
+    <message>
+        <source>Interface Revision:</source>
+        <translation>Versione interfaccia:</translation>
+    </message>
+    <message>
+        <source>Kernel:</source>
+        <translation>Kernel:</translation>
+    </message>
+    <message>
+        <source>Bootloader:</source>
+        <translation>Bootloader:</translation>
+    </message>
+    <message>
+        <source>Server URL:</source>
+        <translation>URL del server:</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPowerPage</name>
+    <message>
+        <source>Power</source>
+        <translation>Alimentazione</translation>
+    </message>
+    <message>
+        <source>Power Off</source>
+        <translation>Spegni</translation>
+    </message>
+    <message>
+        <source>Reboot</source>
+        <translation>Riavvia</translation>
+    </message>
+    <message>
+        <source>Shutdown Instrument?</source>
+        <translation>Spegnere lo strumento?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to shutdown the instrument?</source>
+        <translation>Spegnere davvero lo strumento?</translation>
+    </message>
+    <message>
+        <source>Enter Standby Mode?</source>
+        <translation>Passare in standby?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to put the instrument into standby mode?</source>
+        <translation>Mettere davvero lo strumento in standby?</translation>
+    </message>
+    <message>
+        <source>Reboot Instrument?</source>
+        <translation>Riavviare lo strumento?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to reboot the instrument?</source>
+        <translation>Riavviare davvero lo strumento?</translation>
+    </message>
+    <message>
+        <source>Yes</source>
+        <translation>Sì</translation>
+    </message>
+    <message>
+        <source>No</source>
+        <translation>No</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDatabaseMemoryPage</name>
+    <message>
+        <source>Database / Memory</source>
+        <translation>Database / memoria</translation>
+    </message>
+    <message>
+        <source>Samples</source>
+        <translation>Campioni</translation>
+    </message>
+    <message>
+        <source>Jobs</source>
+        <translation>Lavori</translation>
+    </message>
+    <message>
+        <source>Clear Database</source>
+        <translation>Cancella database</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPowerOptionsPage</name>
+    <message>
+        <source>Power Saving
+Options</source>
+        <translation>Risparmio
+energetico</translation>
+    </message>
+    <message>
+        <source>Dim Display</source>
+        <translation>Attenua display</translation>
+    </message>
+    <message>
+        <source>Standby Mode</source>
+        <translation>Modalità standby</translation>
+    </message>
+    <message>
+        <source>Power Off</source>
+        <translation>Spegni</translation>
+    </message>
+    <message>
+        <source>Seconds until display dims:</source>
+        <translation>Secondi prima di attenuare:</translation>
+    </message>
+    <message>
+        <source>Minutes until standby mode:</source>
+        <translation>Minuti prima dello standby:</translation>
+    </message>
+    <message>
+        <source>Minutes until power off:</source>
+        <translation>Minuti prima dello spegnimento:</translation>
+    </message>
+</context>
+<context>
+    <name>RestoreFactorySettingsPopup</name>
+    <message>
+        <source>Confirm by moving the dot around the circle</source>
+        <translation>Conferma trascinando il punto lungo il cerchio</translation>
+    </message>
+    <message>
+        <source>Restore Factory Settings</source>
+        <translation>Ripristina impostazioni di fabbrica</translation>
+    </message>
+    <message>
+        <source>All current user settings will go back to defaults. Any jobs or samples will also be lost!</source>
+        <translation>Tutte le impostazioni torneranno ai valori predefiniti. Anche i lavori e i campioni andranno persi!</translation>
+    </message>
+</context>
+<context>
+    <name>DeleteAllSamplesPopup</name>
+    <message>
+        <source>Clear Database</source>
+        <translation>Cancella database</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to clear the database, this will delete all samples and jobs from the instrument?</source>
+        <translation>Cancellare davvero il database? Tutti i campioni e i lavori dello strumento verranno eliminati.</translation>
+    </message>
+</context>
+<context>
+    <name>WifiPasswordScreen</name>
+    <message>
+        <source>Password</source>
+        <translation>Password</translation>
+    </message>
+    <message>
+        <source>ABC</source>
+        <translation>ABC</translation>
+    </message>
+    <message>
+        <source>@&amp;*</source>
+        <translation>@&amp;*</translation>
+    </message>
+</context>
 </TS>

@@ -583,4 +583,496 @@
         <translation>すべてのジョブをサーバーに送信</translation>
     </message>
 </context>
+<context>
+    <name>SettingsMainPage</name>
+    <message>
+        <source>Settings</source>
+        <translation>設定</translation>
+    </message>
+    <message>
+        <source>Valid</source>
+        <translation>有効</translation>
+    </message>
+    <message>
+        <source>Expired</source>
+        <translation>期限切れ</translation>
+    </message>
+    <message>
+        <source>Not Connected</source>
+        <translation>未接続</translation>
+    </message>
+    <message>
+        <source>%1</source>
+        <translation>%1</translation>
+    </message>
+    <message>
+        <source>%1%</source>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>Power</source>
+        <translation>電源</translation>
+    </message>
+    <message>
+        <source>Language</source>
+        <translation>言語</translation>
+    </message>
+    <message>
+        <source>Calibration</source>
+        <translation>校正</translation>
+    </message>
+    <message>
+        <source>Measurement Options</source>
+        <translation>測定オプション</translation>
+    </message>
+    <message>
+        <source>Wi-Fi</source>
+        <translation>Wi-Fi</translation>
+    </message>
+    <message>
+        <source>Display Settings</source>
+        <translation>ディスプレイ設定</translation>
+    </message>
+    <message>
+        <source>Beeper Volume</source>
+        <translation>ビープ音量</translation>
+    </message>
+    <message>
+        <source>Power Saving Options</source>
+        <translation>省電力オプション</translation>
+    </message>
+    <message>
+        <source>System &amp; Diagnostics</source>
+        <translation>システムと診断</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsWifiPage</name>
+    <message>
+        <source>Wi-Fi</source>
+        <translation>Wi-Fi</translation>
+    </message>
+    <message>
+        <source>On</source>
+        <translation>オン</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>オフ</translation>
+    </message>
+    <message>
+        <source>Static IP</source>
+        <translation>固定IP</translation>
+    </message>
+    <message>
+        <source>DHCP</source>
+        <translation>DHCP</translation>
+    </message>
+    <message>
+        <source>Known Networks</source>
+        <translation>登録済みネットワーク</translation>
+    </message>
+    <message>
+        <source>Unknown Networks</source>
+        <translation>その他のネットワーク</translation>
+    </message>
+    <message>
+        <source>Connection Issue</source>
+        <translation>接続の問題</translation>
+    </message>
+    <message>
+        <source>Incorrect password</source>
+        <translation>パスワードが正しくありません</translation>
+    </message>
+    <message>
+        <source>Network not in range</source>
+        <translation>ネットワークが圏外です</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsMeasurementPage</name>
+    <message>
+        <source>On</source>
+        <translation>オン</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>オフ</translation>
+    </message>
+    <message>
+        <source>Measurement Options</source>
+        <translation>測定オプション</translation>
+    </message>
+    <message>
+        <source>Auto Measurement</source>
+        <translation>自動測定</translation>
+    </message>
+    <message>
+        <source>Time to start auto measurement (sec):</source>
+        <translation>自動測定開始までの時間（秒）：</translation>
+    </message>
+    <message>
+        <source>Measurement Mode</source>
+        <translation>測定モード</translation>
+    </message>
+    <message>
+        <source>No. of good measurements required:</source>
+        <translation>必要な良好測定数：</translation>
+    </message>
+    <message>
+        <source>Maximum measurements:</source>
+        <translation>最大測定数：</translation>
+    </message>
+    <message>
+        <source>Auto Measurements: %1</source>
+        <translation>自動測定：%1</translation>
+    </message>
+    <message>
+        <source>Display LABCH: %1</source>
+        <translation>LABCH表示：%1</translation>
+    </message>
+    <message>
+        <source>Override Pressure Sensors: %1</source>
+        <translation>圧力センサーを無視：%1</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionSliderItem</name>
+    <message>
+        <source>Never</source>
+        <translation>しない</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionProgressItem</name>
+    <message>
+        <source>%1%</source>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>%1 of %2</source>
+        <translation>%1 / %2</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionPowerInfo</name>
+    <message>
+        <source>%1 hour </source>
+        <translation>%1時間</translation>
+    </message>
+    <message>
+        <source>%1 hours </source>
+        <translation>%1時間</translation>
+    </message>
+    <message>
+        <source>%1 minutes and </source>
+        <translation>%1分</translation>
+    </message>
+    <message>
+        <source>%1 seconds</source>
+        <translation>%1秒</translation>
+    </message>
+    <message>
+        <source>Never</source>
+        <translation>しない</translation>
+    </message>
+    <message>
+        <source>Display dims after: %1
+Standby after: %2
+Power off after: %3</source>
+        <translation>画面減光まで：%1
+スタンバイまで：%2
+電源オフまで：%3</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsLegalInformationPage</name>
+    <message>
+        <source>Legal Information</source>
+        <translation>法的情報</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsSystemAndDiagnosticsPage</name>
+    <message>
+        <source>System &amp;
+Diagnostics</source>
+        <translation>システムと
+診断</translation>
+    </message>
+    <message>
+        <source>System Information</source>
+        <translation>システム情報</translation>
+    </message>
+    <message>
+        <source>Database / Memory</source>
+        <translation>データベース／メモリ</translation>
+    </message>
+    <message>
+        <source>Legal Information</source>
+        <translation>法的情報</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>セルフテスト</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDisplayPage</name>
+    <message>
+        <source>Display Settings</source>
+        <translation>ディスプレイ設定</translation>
+    </message>
+    <message>
+        <source>Display Brightness</source>
+        <translation>画面の明るさ</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsVolumePage</name>
+    <message>
+        <source>Beeper Volume</source>
+        <translation>ビープ音量</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsLanguagePage</name>
+    <message>
+        <source>Language</source>
+        <translation>言語</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDirectoryExplorerPage</name>
+    <message>
+        <source>No files</source>
+        <translation>ファイルがありません</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsFileViewerPage</name>
+    <message>
+        <source>The file can't be shown.</source>
+        <translation>ファイルを表示できません。</translation>
+    </message>
+    <message>
+        <source>The file can't be read.</source>
+        <translation>ファイルを読み込めません。</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsSystemInformationPage</name>
+    <message>
+        <source>System Information</source>
+        <translation>システム情報</translation>
+    </message>
+    <message>
+        <source>Restore Factory Settings</source>
+        <translation>工場出荷時設定に戻す</translation>
+    </message>
+    <message>
+        <source>Open Source</source>
+        <translation>オープンソース</translation>
+    </message>
+    <message>
+        <source>Burn in BIRCH JuniperX/Juniper</source>
+        <translation>Burn in BIRCH JuniperX/Juniper</translation>
+    </message>
+    <message>
+        <source>Burn in ALDER Larch</source>
+        <translation>Burn in ALDER Larch</translation>
+    </message>
+    <message>
+        <source>Burn in Spruce / Sequoia</source>
+        <translation>Burn in Spruce / Sequoia</translation>
+    </message>
+    <message>
+        <source>Not Configured</source>
+        <translation>未設定</translation>
+    </message>
+    <message>
+        <source>Instrument Model:</source>
+        <translation>モデル：</translation>
+    </message>
+    <message>
+        <source>Instrument Serial:</source>
+        <translation>シリアル番号：</translation>
+    </message>
+    <message>
+        <source>Part Number:</source>
+        <translation>部品番号：</translation>
+    </message>
+    <message>
+        <source>White Reference Tile:</source>
+        <translation>白色校正板：</translation>
+    </message>
+    <message>
+        <source>Certification Date:</source>
+        <translation>認証日：</translation>
+    </message>
+    <message>
+        <source>Firmware Revision:</source>
+        <translation>ファームウェア版：</translation>
+    </message>
+    <message>
+        <source>Interface Revision:</source>
+        <translation>インターフェース版：</translation>
+    </message>
+    <message>
+        <source>Kernel:</source>
+        <translation>カーネル：</translation>
+    </message>
+    <message>
+        <source>Bootloader:</source>
+        <translation>ブートローダー：</translation>
+    </message>
+    <message>
+        <source>Server URL:</source>
+        <translation>サーバーURL：</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPowerPage</name>
+    <message>
+        <source>Power</source>
+        <translation>電源</translation>
+    </message>
+    <message>
+        <source>Power Off</source>
+        <translation>電源オフ</translation>
+    </message>
+    <message>
+        <source>Reboot</source>
+        <translation>再起動</translation>
+    </message>
+    <message>
+        <source>Shutdown Instrument?</source>
+        <translation>機器の電源を切りますか？</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to shutdown the instrument?</source>
+        <translation>機器の電源を切ってもよろしいですか？</translation>
+    </message>
+    <message>
+        <source>Enter Standby Mode?</source>
+        <translation>スタンバイにしますか？</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to put the instrument into standby mode?</source>
+        <translation>機器をスタンバイにしてもよろしいですか？</translation>
+    </message>
+    <message>
+        <source>Reboot Instrument?</source>
+        <translation>機器を再起動しますか？</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to reboot the instrument?</source>
+        <translation>機器を再起動してもよろしいですか？</translation>
+    </message>
+    <message>
+        <source>Yes</source>
+        <translation>はい</translation>
+    </message>
+    <message>
+        <source>No</source>
+        <translation>いいえ</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDatabaseMemoryPage</name>
+    <message>
+        <source>Database / Memory</source>
+        <translation>データベース／メモリ</translation>
+    </message>
+    <message>
+        <source>Samples</source>
+        <translation>サンプル</translation>
+    </message>
+    <message>
+        <source>Jobs</source>
+        <translation>ジョブ</translation>
+    </message>
+    <message>
+        <source>Clear Database</source>
+        <translation>データベースを消去</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPowerOptionsPage</name>
+    <message>
+        <source>Power Saving
+Options</source>
+        <translation>省電力
+オプション</translation>
+    </message>
+    <message>
+        <source>Dim Display</source>
+        <translation>画面を暗くする</translation>
+    </message>
+    <message>
+        <source>Standby Mode</source>
+        <translation>スタンバイ</translation>
+    </message>
+    <message>
+        <source>Power Off</source>
+        <translation>電源オフ</translation>
+    </message>
+    <message>
+        <source>Seconds until display dims:</source>
+        <translation>画面が暗くなるまでの秒数：</translation>
+    </message>
+    <message>
+        <source>Minutes until standby mode:</source>
+        <translation>スタンバイまでの分数：</translation>
+    </message>
+    <message>
+        <source>Minutes until power off:</source>
+        <translation>電源オフまでの分数：</translation>
+    </message>
+</context>
+<context>
+    <name>RestoreFactorySettingsPopup</name>
+    <message>
+        <source>Confirm by moving the dot around the circle</source>
+        <translation>点を円に沿って一周させて確定します</translation>
+    </message>
+    <message>
+        <source>Restore Factory Settings</source>
+        <translation>工場出荷時設定に戻す</translation>
+    </message>
+    <message>
+        <source>All current user settings will go back to defaults. Any jobs or samples will also be lost!</source>
+        <translation>すべての設定が初期値に戻ります。ジョブとサンプルもすべて失われます！</translation>
+    </message>
+</context>
+<context>
+    <name>DeleteAllSamplesPopup</name>
+    <message>
+        <source>Clear Database</source>
+        <translation>データベースを消去</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to clear the database, this will delete all samples and jobs from the instrument?</source>
+        <translation>データベースを消去しますか？機器のすべてのサンプルとジョブが削除されます。</translation>
+    </message>
+</context>
+<context>
+    <name>WifiPasswordScreen</name>
+    <message>
+        <source>Password</source>
+        <translation>パスワード</translation>
+    </message>
+    <message>
+        <source>ABC</source>
+        <translation>ABC</translation>
+    </message>
+    <message>
+        <source>@&amp;*</source>
+        <translation>@&amp;*</translation>
+    </message>
+</context>
 </TS>

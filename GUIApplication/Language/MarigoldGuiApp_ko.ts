@@ -583,4 +583,496 @@
         <translation>모든 작업을 서버로 전송</translation>
     </message>
 </context>
+<context>
+    <name>SettingsMainPage</name>
+    <message>
+        <source>Settings</source>
+        <translation>설정</translation>
+    </message>
+    <message>
+        <source>Valid</source>
+        <translation>유효</translation>
+    </message>
+    <message>
+        <source>Expired</source>
+        <translation>만료됨</translation>
+    </message>
+    <message>
+        <source>Not Connected</source>
+        <translation>연결 안 됨</translation>
+    </message>
+    <message>
+        <source>%1</source>
+        <translation>%1</translation>
+    </message>
+    <message>
+        <source>%1%</source>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>Power</source>
+        <translation>전원</translation>
+    </message>
+    <message>
+        <source>Language</source>
+        <translation>언어</translation>
+    </message>
+    <message>
+        <source>Calibration</source>
+        <translation>교정</translation>
+    </message>
+    <message>
+        <source>Measurement Options</source>
+        <translation>측정 옵션</translation>
+    </message>
+    <message>
+        <source>Wi-Fi</source>
+        <translation>Wi-Fi</translation>
+    </message>
+    <message>
+        <source>Display Settings</source>
+        <translation>디스플레이 설정</translation>
+    </message>
+    <message>
+        <source>Beeper Volume</source>
+        <translation>신호음 볼륨</translation>
+    </message>
+    <message>
+        <source>Power Saving Options</source>
+        <translation>절전 옵션</translation>
+    </message>
+    <message>
+        <source>System &amp; Diagnostics</source>
+        <translation>시스템 및 진단</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsWifiPage</name>
+    <message>
+        <source>Wi-Fi</source>
+        <translation>Wi-Fi</translation>
+    </message>
+    <message>
+        <source>On</source>
+        <translation>켜짐</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>꺼짐</translation>
+    </message>
+    <message>
+        <source>Static IP</source>
+        <translation>고정 IP</translation>
+    </message>
+    <message>
+        <source>DHCP</source>
+        <translation>DHCP</translation>
+    </message>
+    <message>
+        <source>Known Networks</source>
+        <translation>알려진 네트워크</translation>
+    </message>
+    <message>
+        <source>Unknown Networks</source>
+        <translation>사용 가능한 네트워크</translation>
+    </message>
+    <message>
+        <source>Connection Issue</source>
+        <translation>연결 문제</translation>
+    </message>
+    <message>
+        <source>Incorrect password</source>
+        <translation>비밀번호가 올바르지 않습니다</translation>
+    </message>
+    <message>
+        <source>Network not in range</source>
+        <translation>네트워크가 범위를 벗어났습니다</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>확인</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsMeasurementPage</name>
+    <message>
+        <source>On</source>
+        <translation>켜짐</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>꺼짐</translation>
+    </message>
+    <message>
+        <source>Measurement Options</source>
+        <translation>측정 옵션</translation>
+    </message>
+    <message>
+        <source>Auto Measurement</source>
+        <translation>자동 측정</translation>
+    </message>
+    <message>
+        <source>Time to start auto measurement (sec):</source>
+        <translation>자동 측정 시작까지 시간(초):</translation>
+    </message>
+    <message>
+        <source>Measurement Mode</source>
+        <translation>측정 모드</translation>
+    </message>
+    <message>
+        <source>No. of good measurements required:</source>
+        <translation>필요한 양호 측정 수:</translation>
+    </message>
+    <message>
+        <source>Maximum measurements:</source>
+        <translation>최대 측정 수:</translation>
+    </message>
+    <message>
+        <source>Auto Measurements: %1</source>
+        <translation>자동 측정: %1</translation>
+    </message>
+    <message>
+        <source>Display LABCH: %1</source>
+        <translation>LABCH 표시: %1</translation>
+    </message>
+    <message>
+        <source>Override Pressure Sensors: %1</source>
+        <translation>압력 센서 무시: %1</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionSliderItem</name>
+    <message>
+        <source>Never</source>
+        <translation>안 함</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionProgressItem</name>
+    <message>
+        <source>%1%</source>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>%1 of %2</source>
+        <translation>%1 / %2</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionPowerInfo</name>
+    <message>
+        <source>%1 hour </source>
+        <translation>%1시간 </translation>
+    </message>
+    <message>
+        <source>%1 hours </source>
+        <translation>%1시간 </translation>
+    </message>
+    <message>
+        <source>%1 minutes and </source>
+        <translation>%1분 </translation>
+    </message>
+    <message>
+        <source>%1 seconds</source>
+        <translation>%1초</translation>
+    </message>
+    <message>
+        <source>Never</source>
+        <translation>안 함</translation>
+    </message>
+    <message>
+        <source>Display dims after: %1
+Standby after: %2
+Power off after: %3</source>
+        <translation>화면 어둡게: %1 후
+대기: %2 후
+전원 끄기: %3 후</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsLegalInformationPage</name>
+    <message>
+        <source>Legal Information</source>
+        <translation>법적 정보</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsSystemAndDiagnosticsPage</name>
+    <message>
+        <source>System &amp;
+Diagnostics</source>
+        <translation>시스템 및
+진단</translation>
+    </message>
+    <message>
+        <source>System Information</source>
+        <translation>시스템 정보</translation>
+    </message>
+    <message>
+        <source>Database / Memory</source>
+        <translation>데이터베이스 / 메모리</translation>
+    </message>
+    <message>
+        <source>Legal Information</source>
+        <translation>법적 정보</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>자체 테스트</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDisplayPage</name>
+    <message>
+        <source>Display Settings</source>
+        <translation>디스플레이 설정</translation>
+    </message>
+    <message>
+        <source>Display Brightness</source>
+        <translation>화면 밝기</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsVolumePage</name>
+    <message>
+        <source>Beeper Volume</source>
+        <translation>신호음 볼륨</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsLanguagePage</name>
+    <message>
+        <source>Language</source>
+        <translation>언어</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDirectoryExplorerPage</name>
+    <message>
+        <source>No files</source>
+        <translation>파일 없음</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsFileViewerPage</name>
+    <message>
+        <source>The file can't be shown.</source>
+        <translation>파일을 표시할 수 없습니다.</translation>
+    </message>
+    <message>
+        <source>The file can't be read.</source>
+        <translation>파일을 읽을 수 없습니다.</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsSystemInformationPage</name>
+    <message>
+        <source>System Information</source>
+        <translation>시스템 정보</translation>
+    </message>
+    <message>
+        <source>Restore Factory Settings</source>
+        <translation>공장 설정 복원</translation>
+    </message>
+    <message>
+        <source>Open Source</source>
+        <translation>오픈 소스</translation>
+    </message>
+    <message>
+        <source>Burn in BIRCH JuniperX/Juniper</source>
+        <translation>Burn in BIRCH JuniperX/Juniper</translation>
+    </message>
+    <message>
+        <source>Burn in ALDER Larch</source>
+        <translation>Burn in ALDER Larch</translation>
+    </message>
+    <message>
+        <source>Burn in Spruce / Sequoia</source>
+        <translation>Burn in Spruce / Sequoia</translation>
+    </message>
+    <message>
+        <source>Not Configured</source>
+        <translation>설정되지 않음</translation>
+    </message>
+    <message>
+        <source>Instrument Model:</source>
+        <translation>모델:</translation>
+    </message>
+    <message>
+        <source>Instrument Serial:</source>
+        <translation>일련번호:</translation>
+    </message>
+    <message>
+        <source>Part Number:</source>
+        <translation>부품 번호:</translation>
+    </message>
+    <message>
+        <source>White Reference Tile:</source>
+        <translation>백색 기준판:</translation>
+    </message>
+    <message>
+        <source>Certification Date:</source>
+        <translation>인증 날짜:</translation>
+    </message>
+    <message>
+        <source>Firmware Revision:</source>
+        <translation>펌웨어 버전:</translation>
+    </message>
+    <message>
+        <source>Interface Revision:</source>
+        <translation>인터페이스 버전:</translation>
+    </message>
+    <message>
+        <source>Kernel:</source>
+        <translation>커널:</translation>
+    </message>
+    <message>
+        <source>Bootloader:</source>
+        <translation>부트로더:</translation>
+    </message>
+    <message>
+        <source>Server URL:</source>
+        <translation>서버 URL:</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPowerPage</name>
+    <message>
+        <source>Power</source>
+        <translation>전원</translation>
+    </message>
+    <message>
+        <source>Power Off</source>
+        <translation>전원 끄기</translation>
+    </message>
+    <message>
+        <source>Reboot</source>
+        <translation>재시작</translation>
+    </message>
+    <message>
+        <source>Shutdown Instrument?</source>
+        <translation>기기를 끄시겠습니까?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to shutdown the instrument?</source>
+        <translation>기기를 끄시겠습니까?</translation>
+    </message>
+    <message>
+        <source>Enter Standby Mode?</source>
+        <translation>대기 모드로 전환하시겠습니까?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to put the instrument into standby mode?</source>
+        <translation>기기를 대기 모드로 전환하시겠습니까?</translation>
+    </message>
+    <message>
+        <source>Reboot Instrument?</source>
+        <translation>기기를 재시작하시겠습니까?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to reboot the instrument?</source>
+        <translation>기기를 재시작하시겠습니까?</translation>
+    </message>
+    <message>
+        <source>Yes</source>
+        <translation>예</translation>
+    </message>
+    <message>
+        <source>No</source>
+        <translation>아니요</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDatabaseMemoryPage</name>
+    <message>
+        <source>Database / Memory</source>
+        <translation>데이터베이스 / 메모리</translation>
+    </message>
+    <message>
+        <source>Samples</source>
+        <translation>샘플</translation>
+    </message>
+    <message>
+        <source>Jobs</source>
+        <translation>작업</translation>
+    </message>
+    <message>
+        <source>Clear Database</source>
+        <translation>데이터베이스 지우기</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPowerOptionsPage</name>
+    <message>
+        <source>Power Saving
+Options</source>
+        <translation>절전
+옵션</translation>
+    </message>
+    <message>
+        <source>Dim Display</source>
+        <translation>화면 어둡게</translation>
+    </message>
+    <message>
+        <source>Standby Mode</source>
+        <translation>대기 모드</translation>
+    </message>
+    <message>
+        <source>Power Off</source>
+        <translation>전원 끄기</translation>
+    </message>
+    <message>
+        <source>Seconds until display dims:</source>
+        <translation>화면이 어두워질 때까지 초:</translation>
+    </message>
+    <message>
+        <source>Minutes until standby mode:</source>
+        <translation>대기 모드까지 분:</translation>
+    </message>
+    <message>
+        <source>Minutes until power off:</source>
+        <translation>전원 꺼짐까지 분:</translation>
+    </message>
+</context>
+<context>
+    <name>RestoreFactorySettingsPopup</name>
+    <message>
+        <source>Confirm by moving the dot around the circle</source>
+        <translation>점을 원을 따라 한 바퀴 돌려 확인하세요</translation>
+    </message>
+    <message>
+        <source>Restore Factory Settings</source>
+        <translation>공장 설정 복원</translation>
+    </message>
+    <message>
+        <source>All current user settings will go back to defaults. Any jobs or samples will also be lost!</source>
+        <translation>모든 설정이 기본값으로 돌아갑니다. 작업과 샘플도 모두 삭제됩니다!</translation>
+    </message>
+</context>
+<context>
+    <name>DeleteAllSamplesPopup</name>
+    <message>
+        <source>Clear Database</source>
+        <translation>데이터베이스 지우기</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to clear the database, this will delete all samples and jobs from the instrument?</source>
+        <translation>데이터베이스를 지우시겠습니까? 기기의 모든 샘플과 작업이 삭제됩니다.</translation>
+    </message>
+</context>
+<context>
+    <name>WifiPasswordScreen</name>
+    <message>
+        <source>Password</source>
+        <translation>비밀번호</translation>
+    </message>
+    <message>
+        <source>ABC</source>
+        <translation>ABC</translation>
+    </message>
+    <message>
+        <source>@&amp;*</source>
+        <translation>@&amp;*</translation>
+    </message>
+</context>
 </TS>

@@ -583,4 +583,496 @@
         <translation>Enviar todos os trabalhos para o servidor</translation>
     </message>
 </context>
+<context>
+    <name>SettingsMainPage</name>
+    <message>
+        <source>Settings</source>
+        <translation>Configurações</translation>
+    </message>
+    <message>
+        <source>Valid</source>
+        <translation>Válida</translation>
+    </message>
+    <message>
+        <source>Expired</source>
+        <translation>Expirada</translation>
+    </message>
+    <message>
+        <source>Not Connected</source>
+        <translation>Não conectado</translation>
+    </message>
+    <message>
+        <source>%1</source>
+        <translation>%1</translation>
+    </message>
+    <message>
+        <source>%1%</source>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>Power</source>
+        <translation>Energia</translation>
+    </message>
+    <message>
+        <source>Language</source>
+        <translation>Idioma</translation>
+    </message>
+    <message>
+        <source>Calibration</source>
+        <translation>Calibração</translation>
+    </message>
+    <message>
+        <source>Measurement Options</source>
+        <translation>Opções de medição</translation>
+    </message>
+    <message>
+        <source>Wi-Fi</source>
+        <translation>Wi-Fi</translation>
+    </message>
+    <message>
+        <source>Display Settings</source>
+        <translation>Tela</translation>
+    </message>
+    <message>
+        <source>Beeper Volume</source>
+        <translation>Volume do bipe</translation>
+    </message>
+    <message>
+        <source>Power Saving Options</source>
+        <translation>Economia de energia</translation>
+    </message>
+    <message>
+        <source>System &amp; Diagnostics</source>
+        <translation>Sistema e diagnóstico</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsWifiPage</name>
+    <message>
+        <source>Wi-Fi</source>
+        <translation>Wi-Fi</translation>
+    </message>
+    <message>
+        <source>On</source>
+        <translation>Ligado</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>Desligado</translation>
+    </message>
+    <message>
+        <source>Static IP</source>
+        <translation>IP estático</translation>
+    </message>
+    <message>
+        <source>DHCP</source>
+        <translation>DHCP</translation>
+    </message>
+    <message>
+        <source>Known Networks</source>
+        <translation>Redes conhecidas</translation>
+    </message>
+    <message>
+        <source>Unknown Networks</source>
+        <translation>Redes disponíveis</translation>
+    </message>
+    <message>
+        <source>Connection Issue</source>
+        <translation>Problema de conexão</translation>
+    </message>
+    <message>
+        <source>Incorrect password</source>
+        <translation>Senha incorreta</translation>
+    </message>
+    <message>
+        <source>Network not in range</source>
+        <translation>Rede fora de alcance</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsMeasurementPage</name>
+    <message>
+        <source>On</source>
+        <translation>Ligado</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>Desligado</translation>
+    </message>
+    <message>
+        <source>Measurement Options</source>
+        <translation>Opções de medição</translation>
+    </message>
+    <message>
+        <source>Auto Measurement</source>
+        <translation>Medição automática</translation>
+    </message>
+    <message>
+        <source>Time to start auto measurement (sec):</source>
+        <translation>Tempo até a medição automática (s):</translation>
+    </message>
+    <message>
+        <source>Measurement Mode</source>
+        <translation>Modo de medição</translation>
+    </message>
+    <message>
+        <source>No. of good measurements required:</source>
+        <translation>N.º de medições válidas necessárias:</translation>
+    </message>
+    <message>
+        <source>Maximum measurements:</source>
+        <translation>Máximo de medições:</translation>
+    </message>
+    <message>
+        <source>Auto Measurements: %1</source>
+        <translation>Medições automáticas: %1</translation>
+    </message>
+    <message>
+        <source>Display LABCH: %1</source>
+        <translation>Mostrar LABCH: %1</translation>
+    </message>
+    <message>
+        <source>Override Pressure Sensors: %1</source>
+        <translation>Ignorar sensores de pressão: %1</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionSliderItem</name>
+    <message>
+        <source>Never</source>
+        <translation>Nunca</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionProgressItem</name>
+    <message>
+        <source>%1%</source>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>%1 of %2</source>
+        <translation>%1 de %2</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionPowerInfo</name>
+    <message>
+        <source>%1 hour </source>
+        <translation>%1 hora </translation>
+    </message>
+    <message>
+        <source>%1 hours </source>
+        <translation>%1 horas </translation>
+    </message>
+    <message>
+        <source>%1 minutes and </source>
+        <translation>%1 minutos e </translation>
+    </message>
+    <message>
+        <source>%1 seconds</source>
+        <translation>%1 segundos</translation>
+    </message>
+    <message>
+        <source>Never</source>
+        <translation>Nunca</translation>
+    </message>
+    <message>
+        <source>Display dims after: %1
+Standby after: %2
+Power off after: %3</source>
+        <translation>Escurecer após: %1
+Espera após: %2
+Desligar após: %3</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsLegalInformationPage</name>
+    <message>
+        <source>Legal Information</source>
+        <translation>Informações legais</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsSystemAndDiagnosticsPage</name>
+    <message>
+        <source>System &amp;
+Diagnostics</source>
+        <translation>Sistema e
+diagnóstico</translation>
+    </message>
+    <message>
+        <source>System Information</source>
+        <translation>Informações do sistema</translation>
+    </message>
+    <message>
+        <source>Database / Memory</source>
+        <translation>Banco de dados / memória</translation>
+    </message>
+    <message>
+        <source>Legal Information</source>
+        <translation>Informações legais</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>Autoteste</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDisplayPage</name>
+    <message>
+        <source>Display Settings</source>
+        <translation>Tela</translation>
+    </message>
+    <message>
+        <source>Display Brightness</source>
+        <translation>Brilho da tela</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsVolumePage</name>
+    <message>
+        <source>Beeper Volume</source>
+        <translation>Volume do bipe</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsLanguagePage</name>
+    <message>
+        <source>Language</source>
+        <translation>Idioma</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDirectoryExplorerPage</name>
+    <message>
+        <source>No files</source>
+        <translation>Nenhum arquivo</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsFileViewerPage</name>
+    <message>
+        <source>The file can't be shown.</source>
+        <translation>Não é possível mostrar o arquivo.</translation>
+    </message>
+    <message>
+        <source>The file can't be read.</source>
+        <translation>Não é possível ler o arquivo.</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsSystemInformationPage</name>
+    <message>
+        <source>System Information</source>
+        <translation>Informações do sistema</translation>
+    </message>
+    <message>
+        <source>Restore Factory Settings</source>
+        <translation>Restaurar configurações de fábrica</translation>
+    </message>
+    <message>
+        <source>Open Source</source>
+        <translation>Código aberto</translation>
+    </message>
+    <message>
+        <source>Burn in BIRCH JuniperX/Juniper</source>
+        <translation>Burn in BIRCH JuniperX/Juniper</translation>
+    </message>
+    <message>
+        <source>Burn in ALDER Larch</source>
+        <translation>Burn in ALDER Larch</translation>
+    </message>
+    <message>
+        <source>Burn in Spruce / Sequoia</source>
+        <translation>Burn in Spruce / Sequoia</translation>
+    </message>
+    <message>
+        <source>Not Configured</source>
+        <translation>Não configurado</translation>
+    </message>
+    <message>
+        <source>Instrument Model:</source>
+        <translation>Modelo:</translation>
+    </message>
+    <message>
+        <source>Instrument Serial:</source>
+        <translation>N.º de série:</translation>
+    </message>
+    <message>
+        <source>Part Number:</source>
+        <translation>Código da peça:</translation>
+    </message>
+    <message>
+        <source>White Reference Tile:</source>
+        <translation>Padrão branco:</translation>
+    </message>
+    <message>
+        <source>Certification Date:</source>
+        <translation>Data de certificação:</translation>
+    </message>
+    <message>
+        <source>Firmware Revision:</source>
+        <translation>Versão do firmware:</translation>
+    </message>
+    <message>
+        <source>Interface Revision:</source>
+        <translation>Versão da interface:</translation>
+    </message>
+    <message>
+        <source>Kernel:</source>
+        <translation>Kernel:</translation>
+    </message>
+    <message>
+        <source>Bootloader:</source>
+        <translation>Bootloader:</translation>
+    </message>
+    <message>
+        <source>Server URL:</source>
+        <translation>URL do servidor:</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPowerPage</name>
+    <message>
+        <source>Power</source>
+        <translation>Energia</translation>
+    </message>
+    <message>
+        <source>Power Off</source>
+        <translation>Desligar</translation>
+    </message>
+    <message>
+        <source>Reboot</source>
+        <translation>Reiniciar</translation>
+    </message>
+    <message>
+        <source>Shutdown Instrument?</source>
+        <translation>Desligar o instrumento?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to shutdown the instrument?</source>
+        <translation>Tem certeza de que deseja desligar o instrumento?</translation>
+    </message>
+    <message>
+        <source>Enter Standby Mode?</source>
+        <translation>Entrar em espera?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to put the instrument into standby mode?</source>
+        <translation>Tem certeza de que deseja colocar o instrumento em espera?</translation>
+    </message>
+    <message>
+        <source>Reboot Instrument?</source>
+        <translation>Reiniciar o instrumento?</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to reboot the instrument?</source>
+        <translation>Tem certeza de que deseja reiniciar o instrumento?</translation>
+    </message>
+    <message>
+        <source>Yes</source>
+        <translation>Sim</translation>
+    </message>
+    <message>
+        <source>No</source>
+        <translation>Não</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDatabaseMemoryPage</name>
+    <message>
+        <source>Database / Memory</source>
+        <translation>Banco de dados / memória</translation>
+    </message>
+    <message>
+        <source>Samples</source>
+        <translation>Amostras</translation>
+    </message>
+    <message>
+        <source>Jobs</source>
+        <translation>Trabalhos</translation>
+    </message>
+    <message>
+        <source>Clear Database</source>
+        <translation>Limpar banco de dados</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPowerOptionsPage</name>
+    <message>
+        <source>Power Saving
+Options</source>
+        <translation>Economia
+de energia</translation>
+    </message>
+    <message>
+        <source>Dim Display</source>
+        <translation>Escurecer tela</translation>
+    </message>
+    <message>
+        <source>Standby Mode</source>
+        <translation>Modo de espera</translation>
+    </message>
+    <message>
+        <source>Power Off</source>
+        <translation>Desligar</translation>
+    </message>
+    <message>
+        <source>Seconds until display dims:</source>
+        <translation>Segundos até escurecer a tela:</translation>
+    </message>
+    <message>
+        <source>Minutes until standby mode:</source>
+        <translation>Minutos até o modo de espera:</translation>
+    </message>
+    <message>
+        <source>Minutes until power off:</source>
+        <translation>Minutos até desligar:</translation>
+    </message>
+</context>
+<context>
+    <name>RestoreFactorySettingsPopup</name>
+    <message>
+        <source>Confirm by moving the dot around the circle</source>
+        <translation>Confirme girando o ponto ao redor do círculo</translation>
+    </message>
+    <message>
+        <source>Restore Factory Settings</source>
+        <translation>Restaurar configurações de fábrica</translation>
+    </message>
+    <message>
+        <source>All current user settings will go back to defaults. Any jobs or samples will also be lost!</source>
+        <translation>Todas as configurações voltarão ao padrão. Os trabalhos e as amostras também serão perdidos!</translation>
+    </message>
+</context>
+<context>
+    <name>DeleteAllSamplesPopup</name>
+    <message>
+        <source>Clear Database</source>
+        <translation>Limpar banco de dados</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to clear the database, this will delete all samples and jobs from the instrument?</source>
+        <translation>Tem certeza de que deseja limpar o banco de dados? Todas as amostras e trabalhos do instrumento serão excluídos.</translation>
+    </message>
+</context>
+<context>
+    <name>WifiPasswordScreen</name>
+    <message>
+        <source>Password</source>
+        <translation>Senha</translation>
+    </message>
+    <message>
+        <source>ABC</source>
+        <translation>ABC</translation>
+    </message>
+    <message>
+        <source>@&amp;*</source>
+        <translation>@&amp;*</translation>
+    </message>
+</context>
 </TS>

@@ -583,4 +583,496 @@
         <translation>发送所有任务到服务器</translation>
     </message>
 </context>
+<context>
+    <name>SettingsMainPage</name>
+    <message>
+        <source>Settings</source>
+        <translation>设置</translation>
+    </message>
+    <message>
+        <source>Valid</source>
+        <translation>有效</translation>
+    </message>
+    <message>
+        <source>Expired</source>
+        <translation>已过期</translation>
+    </message>
+    <message>
+        <source>Not Connected</source>
+        <translation>未连接</translation>
+    </message>
+    <message>
+        <source>%1</source>
+        <translation>%1</translation>
+    </message>
+    <message>
+        <source>%1%</source>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>Power</source>
+        <translation>电源</translation>
+    </message>
+    <message>
+        <source>Language</source>
+        <translation>语言</translation>
+    </message>
+    <message>
+        <source>Calibration</source>
+        <translation>校准</translation>
+    </message>
+    <message>
+        <source>Measurement Options</source>
+        <translation>测量选项</translation>
+    </message>
+    <message>
+        <source>Wi-Fi</source>
+        <translation>Wi-Fi</translation>
+    </message>
+    <message>
+        <source>Display Settings</source>
+        <translation>显示设置</translation>
+    </message>
+    <message>
+        <source>Beeper Volume</source>
+        <translation>提示音音量</translation>
+    </message>
+    <message>
+        <source>Power Saving Options</source>
+        <translation>节能选项</translation>
+    </message>
+    <message>
+        <source>System &amp; Diagnostics</source>
+        <translation>系统与诊断</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsWifiPage</name>
+    <message>
+        <source>Wi-Fi</source>
+        <translation>Wi-Fi</translation>
+    </message>
+    <message>
+        <source>On</source>
+        <translation>开</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>关</translation>
+    </message>
+    <message>
+        <source>Static IP</source>
+        <translation>静态 IP</translation>
+    </message>
+    <message>
+        <source>DHCP</source>
+        <translation>DHCP</translation>
+    </message>
+    <message>
+        <source>Known Networks</source>
+        <translation>已知网络</translation>
+    </message>
+    <message>
+        <source>Unknown Networks</source>
+        <translation>可用网络</translation>
+    </message>
+    <message>
+        <source>Connection Issue</source>
+        <translation>连接问题</translation>
+    </message>
+    <message>
+        <source>Incorrect password</source>
+        <translation>密码错误</translation>
+    </message>
+    <message>
+        <source>Network not in range</source>
+        <translation>网络不在范围内</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>确定</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsMeasurementPage</name>
+    <message>
+        <source>On</source>
+        <translation>开</translation>
+    </message>
+    <message>
+        <source>Off</source>
+        <translation>关</translation>
+    </message>
+    <message>
+        <source>Measurement Options</source>
+        <translation>测量选项</translation>
+    </message>
+    <message>
+        <source>Auto Measurement</source>
+        <translation>自动测量</translation>
+    </message>
+    <message>
+        <source>Time to start auto measurement (sec):</source>
+        <translation>自动测量开始前的时间（秒）：</translation>
+    </message>
+    <message>
+        <source>Measurement Mode</source>
+        <translation>测量模式</translation>
+    </message>
+    <message>
+        <source>No. of good measurements required:</source>
+        <translation>所需有效测量次数：</translation>
+    </message>
+    <message>
+        <source>Maximum measurements:</source>
+        <translation>最大测量次数：</translation>
+    </message>
+    <message>
+        <source>Auto Measurements: %1</source>
+        <translation>自动测量：%1</translation>
+    </message>
+    <message>
+        <source>Display LABCH: %1</source>
+        <translation>显示 LABCH：%1</translation>
+    </message>
+    <message>
+        <source>Override Pressure Sensors: %1</source>
+        <translation>忽略压力传感器：%1</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionSliderItem</name>
+    <message>
+        <source>Never</source>
+        <translation>从不</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionProgressItem</name>
+    <message>
+        <source>%1%</source>
+        <translation>%1%</translation>
+    </message>
+    <message>
+        <source>%1 of %2</source>
+        <translation>%1 / %2</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsListSelectionPowerInfo</name>
+    <message>
+        <source>%1 hour </source>
+        <translation>%1小时</translation>
+    </message>
+    <message>
+        <source>%1 hours </source>
+        <translation>%1小时</translation>
+    </message>
+    <message>
+        <source>%1 minutes and </source>
+        <translation>%1分</translation>
+    </message>
+    <message>
+        <source>%1 seconds</source>
+        <translation>%1秒</translation>
+    </message>
+    <message>
+        <source>Never</source>
+        <translation>从不</translation>
+    </message>
+    <message>
+        <source>Display dims after: %1
+Standby after: %2
+Power off after: %3</source>
+        <translation>屏幕变暗：%1后
+待机：%2后
+关机：%3后</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsLegalInformationPage</name>
+    <message>
+        <source>Legal Information</source>
+        <translation>法律信息</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsSystemAndDiagnosticsPage</name>
+    <message>
+        <source>System &amp;
+Diagnostics</source>
+        <translation>系统与
+诊断</translation>
+    </message>
+    <message>
+        <source>System Information</source>
+        <translation>系统信息</translation>
+    </message>
+    <message>
+        <source>Database / Memory</source>
+        <translation>数据库 / 存储</translation>
+    </message>
+    <message>
+        <source>Legal Information</source>
+        <translation>法律信息</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>自检</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDisplayPage</name>
+    <message>
+        <source>Display Settings</source>
+        <translation>显示设置</translation>
+    </message>
+    <message>
+        <source>Display Brightness</source>
+        <translation>屏幕亮度</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsVolumePage</name>
+    <message>
+        <source>Beeper Volume</source>
+        <translation>提示音音量</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsLanguagePage</name>
+    <message>
+        <source>Language</source>
+        <translation>语言</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDirectoryExplorerPage</name>
+    <message>
+        <source>No files</source>
+        <translation>没有文件</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsFileViewerPage</name>
+    <message>
+        <source>The file can't be shown.</source>
+        <translation>无法显示该文件。</translation>
+    </message>
+    <message>
+        <source>The file can't be read.</source>
+        <translation>无法读取该文件。</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsSystemInformationPage</name>
+    <message>
+        <source>System Information</source>
+        <translation>系统信息</translation>
+    </message>
+    <message>
+        <source>Restore Factory Settings</source>
+        <translation>恢复出厂设置</translation>
+    </message>
+    <message>
+        <source>Open Source</source>
+        <translation>开源软件</translation>
+    </message>
+    <message>
+        <source>Burn in BIRCH JuniperX/Juniper</source>
+        <translation>Burn in BIRCH JuniperX/Juniper</translation>
+    </message>
+    <message>
+        <source>Burn in ALDER Larch</source>
+        <translation>Burn in ALDER Larch</translation>
+    </message>
+    <message>
+        <source>Burn in Spruce / Sequoia</source>
+        <translation>Burn in Spruce / Sequoia</translation>
+    </message>
+    <message>
+        <source>Not Configured</source>
+        <translation>未配置</translation>
+    </message>
+    <message>
+        <source>Instrument Model:</source>
+        <translation>型号：</translation>
+    </message>
+    <message>
+        <source>Instrument Serial:</source>
+        <translation>序列号：</translation>
+    </message>
+    <message>
+        <source>Part Number:</source>
+        <translation>部件号：</translation>
+    </message>
+    <message>
+        <source>White Reference Tile:</source>
+        <translation>白板：</translation>
+    </message>
+    <message>
+        <source>Certification Date:</source>
+        <translation>认证日期：</translation>
+    </message>
+    <message>
+        <source>Firmware Revision:</source>
+        <translation>固件版本：</translation>
+    </message>
+    <message>
+        <source>Interface Revision:</source>
+        <translation>界面版本：</translation>
+    </message>
+    <message>
+        <source>Kernel:</source>
+        <translation>内核：</translation>
+    </message>
+    <message>
+        <source>Bootloader:</source>
+        <translation>引导程序：</translation>
+    </message>
+    <message>
+        <source>Server URL:</source>
+        <translation>服务器 URL：</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPowerPage</name>
+    <message>
+        <source>Power</source>
+        <translation>电源</translation>
+    </message>
+    <message>
+        <source>Power Off</source>
+        <translation>关机</translation>
+    </message>
+    <message>
+        <source>Reboot</source>
+        <translation>重启</translation>
+    </message>
+    <message>
+        <source>Shutdown Instrument?</source>
+        <translation>关闭仪器？</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to shutdown the instrument?</source>
+        <translation>确定要关闭仪器吗？</translation>
+    </message>
+    <message>
+        <source>Enter Standby Mode?</source>
+        <translation>进入待机模式？</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to put the instrument into standby mode?</source>
+        <translation>确定要让仪器进入待机模式吗？</translation>
+    </message>
+    <message>
+        <source>Reboot Instrument?</source>
+        <translation>重启仪器？</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to reboot the instrument?</source>
+        <translation>确定要重启仪器吗？</translation>
+    </message>
+    <message>
+        <source>Yes</source>
+        <translation>是</translation>
+    </message>
+    <message>
+        <source>No</source>
+        <translation>否</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsDatabaseMemoryPage</name>
+    <message>
+        <source>Database / Memory</source>
+        <translation>数据库 / 存储</translation>
+    </message>
+    <message>
+        <source>Samples</source>
+        <translation>样本</translation>
+    </message>
+    <message>
+        <source>Jobs</source>
+        <translation>作业</translation>
+    </message>
+    <message>
+        <source>Clear Database</source>
+        <translation>清除数据库</translation>
+    </message>
+</context>
+<context>
+    <name>SettingsPowerOptionsPage</name>
+    <message>
+        <source>Power Saving
+Options</source>
+        <translation>节能
+选项</translation>
+    </message>
+    <message>
+        <source>Dim Display</source>
+        <translation>屏幕变暗</translation>
+    </message>
+    <message>
+        <source>Standby Mode</source>
+        <translation>待机模式</translation>
+    </message>
+    <message>
+        <source>Power Off</source>
+        <translation>关机</translation>
+    </message>
+    <message>
+        <source>Seconds until display dims:</source>
+        <translation>屏幕变暗前的秒数：</translation>
+    </message>
+    <message>
+        <source>Minutes until standby mode:</source>
+        <translation>进入待机前的分钟数：</translation>
+    </message>
+    <message>
+        <source>Minutes until power off:</source>
+        <translation>关机前的分钟数：</translation>
+    </message>
+</context>
+<context>
+    <name>RestoreFactorySettingsPopup</name>
+    <message>
+        <source>Confirm by moving the dot around the circle</source>
+        <translation>沿圆圈拖动圆点一周以确认</translation>
+    </message>
+    <message>
+        <source>Restore Factory Settings</source>
+        <translation>恢复出厂设置</translation>
+    </message>
+    <message>
+        <source>All current user settings will go back to defaults. Any jobs or samples will also be lost!</source>
+        <translation>所有设置将恢复为默认值。所有作业和样本也将丢失！</translation>
+    </message>
+</context>
+<context>
+    <name>DeleteAllSamplesPopup</name>
+    <message>
+        <source>Clear Database</source>
+        <translation>清除数据库</translation>
+    </message>
+    <message>
+        <source>Are you sure you want to clear the database, this will delete all samples and jobs from the instrument?</source>
+        <translation>确定要清除数据库吗？仪器上的所有样本和作业都将被删除。</translation>
+    </message>
+</context>
+<context>
+    <name>WifiPasswordScreen</name>
+    <message>
+        <source>Password</source>
+        <translation>密码</translation>
+    </message>
+    <message>
+        <source>ABC</source>
+        <translation>ABC</translation>
+    </message>
+    <message>
+        <source>@&amp;*</source>
+        <translation>@&amp;*</translation>
+    </message>
+</context>
 </TS>

@@ -43,7 +43,12 @@ void SettingsPage::construct(const QString& title, const QString& icon)
 {
     ui->setupUi(this);
     ui->BtnBack->setIcon(backButtonIcon());
+    // Colour by palette: a style sheet would undo the font the label fits.
+    QPalette titlePalette = ui->labelSubHeader->palette();
+    titlePalette.setColor(QPalette::WindowText, QColor(241, 242, 242));
+    ui->labelSubHeader->setPalette(titlePalette);
     ui->labelSubHeader->setWordWrap(true);
+    m_titleFont = ui->labelSubHeader->defaultFont();
     ui->labelSubHeader->setAutoSize(true);
     ui->SettingsList->setShadowsEnabled(true);
     m_signalMapper = new QSignalMapper(this);
@@ -150,6 +155,7 @@ void SettingsPage::updateIconLocation()
     textWidth += 10;
     if (!hasIcon) {
         ui->labelSubHeader->setGeometry(left, 0, 198, ui->labelSubHeader->height());
+        fitTitleFont(198);
         ui->labelSubHeader->setText(ui->labelSubHeader->defaultText());
         return;
     }
@@ -159,7 +165,26 @@ void SettingsPage::updateIconLocation()
     const int x = qBound(left, width() > 0 ? 160 - groupWidth / 2 : left, right - groupWidth);
     ui->labelIcon->move(x, ui->labelIcon->y());
     ui->labelSubHeader->setGeometry(x + iconWidth + kTitleIconGap, 0, textWidth, ui->labelSubHeader->height());
+    fitTitleFont(textWidth);
     ui->labelSubHeader->setText(ui->labelSubHeader->defaultText());
+}
+
+void SettingsPage::fitTitleFont(int boxWidth)
+{
+    // A single long word (a German compound) cannot wrap: it shrinks.
+    QFont font = m_titleFont;
+    const QStringList lines = ui->labelSubHeader->defaultText().split('\n');
+    auto widest = [&lines](const QFont& f) {
+        int w = 0;
+        for (const QString& line : lines) {
+            for (const QString& word : line.split(' '))
+                w = qMax(w, QFontMetrics(f).horizontalAdvance(word));
+        }
+        return w;
+    };
+    while (font.pointSize() > 9 && widest(font) > boxWidth - 6)
+        font.setPointSize(font.pointSize() - 1);
+    ui->labelSubHeader->setFont(font);
 }
 
 void SettingsPage::onGotoScreen(SCREEN_ID_T id)

@@ -65,6 +65,10 @@ protected:
 
 private:
     void construct(const QString& title, const QString& icon);
+    // The title's font as large as the bar allows for the present text.
+    void fitTitleFont(int boxWidth);
+
+    QFont m_titleFont;
 };
 
 #endif // SETTINGSPAGE_H
