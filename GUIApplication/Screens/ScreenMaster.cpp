@@ -4,6 +4,7 @@
 #include "GUIAPI/DataManager.h"
 #include "Screens/ConfigMainScreen.h"
 #include "Screens/DaddyPanel.h"
+#include "Screens/JobEditScreens.h"
 #include "Screens/JobListScreen.h"
 #include "Screens/LockScreen.h"
 #include "Screens/RestoreFactorySettingsPopup.h"
@@ -149,6 +150,14 @@ QWidget* ScreenMaster::createScreen(SCREEN_ID_T id)
     case CONFIG_MAIN_SCREEN_ID: return new ConfigMainScreen(this);
     case RESTORE_FACTORY_SETTINGS_POPUP_SCREEN_ID: return new RestoreFactorySettingsPopup(this);
     case DELETE_ALL_SAMPLES_POPUP_SCREEN_ID: return new DeleteAllSamplesPopup(this);
+    case JOB_NAME_SCREEN_ID: return new JobNameEditScreen(this);
+    case JOB_TAGS_1_SCREEN_ID: return new JobTagEditScreen(TAG_STATE_1, this);
+    case JOB_TAGS_2_SCREEN_ID: return new JobTagEditScreen(TAG_STATE_2, this);
+    case JOB_TAGS_3_SCREEN_ID: return new JobTagEditScreen(TAG_STATE_3, this);
+    case JOB_TAGS_1_FREE_EDIT_SCREEN_ID: return new JobTagFreeEditScreen(TAG_STATE_1, this);
+    case JOB_TAGS_2_FREE_EDIT_SCREEN_ID: return new JobTagFreeEditScreen(TAG_STATE_2, this);
+    case JOB_TAGS_3_FREE_EDIT_SCREEN_ID: return new JobTagFreeEditScreen(TAG_STATE_3, this);
+    case JOB_FREE_TEXT_SCREEN_ID: return new JobFreeTextEditScreen(this);
     default: return nullptr;
     }
 }

@@ -162,12 +162,15 @@ int XMLParser::parseKeypadXML(const QByteArray& bytes, KeypadArray& keys)
         if (token == QXmlStreamReader::NoToken || token == QXmlStreamReader::EndDocument)
             break;
         if (token == QXmlStreamReader::Invalid) {
-            // The reader stays on its invalid token for ever; the keys read so
-            // far decide.
-            qDebug().noquote() << QStringLiteral("Keypad layout is not well-formed at line %1: %2")
+            // The reader stays on its invalid token for ever, so the loop must
+            // leave here. Half a layout is worse than none: the caller falls
+            // back to the built-in one.
+            qDebug().noquote() << QStringLiteral("Keypad layout is not well-formed at line %1, column %2: %3; the layout is refused")
                                       .arg(reader.lineNumber())
+                                      .arg(reader.columnNumber())
                                       .arg(reader.errorString());
-            break;
+            keys.clear();
+            return KEYPAD_XML_NOT_WELL_FORMED;
         }
         if (token != QXmlStreamReader::StartElement)
             continue;

@@ -30,6 +30,8 @@ constexpr int TAG_XML_NAME_STARTS_DISPLAY = 0x1000;
 constexpr int TAG_XML_NAME_ENDS_ID = 0x10000;
 // A keypad layout without a single key.
 constexpr int KEYPAD_XML_NO_KEYS = 0x100000;
+// A keypad layout that is not well-formed XML.
+constexpr int KEYPAD_XML_NOT_WELL_FORMED = 0x200000;
 
 extern const char* const FILTER_XML_PATH;             // "/opt/Filter/Filter.xml"
 extern const char* const FILTER_TRANSLATION_XML_PATH; // "/opt/Filter/FilterTranslation.xml"

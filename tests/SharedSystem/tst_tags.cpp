@@ -342,15 +342,16 @@ private slots:
     void brokenLayoutEndsTheWalk()
     {
         // Not well-formed: the walk stops at the fault instead of spinning on
-        // it; the keys before it count.
+        // it, and the whole layout is refused so that the caller falls back
+        // to the built-in one rather than half a keypad.
         XMLParser parser(FILTER_SCHEMA_PATH, TRANSLATION_SCHEMA_PATH);
         KeypadArray keys;
         const QByteArray layout =
             "<keypad><key characterCap=\"65\" characterLow=\"97\" xCoord=\"1\" yCoord=\"2\" width=\"3\" height=\"4\"/>"
             "<key characterCap=\"66\" <<<";
-        QCOMPARE(parser.parseKeypadXML(layout, keys), 0);
-        QCOMPARE(keys.size(), 1);
-        QCOMPARE(parser.parseKeypadXML("<<<", keys), KEYPAD_XML_NO_KEYS);
+        QCOMPARE(parser.parseKeypadXML(layout, keys), KEYPAD_XML_NOT_WELL_FORMED);
+        QVERIFY(keys.isEmpty());
+        QCOMPARE(parser.parseKeypadXML("<<<", keys), KEYPAD_XML_NOT_WELL_FORMED);
     }
 };
 
