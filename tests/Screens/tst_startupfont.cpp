@@ -82,6 +82,10 @@ private slots:
         QTRY_VERIFY(master.currentScreen() != home || home->isEnabled());
         if (master.currentScreen() == home)
             QVERIFY(home->isEnabled());
+        // The settings screen, where it exists, goes again.
+        if (master.currentScreen() != home)
+            master.onCloseCurrentScreen();
+        QCOMPARE(master.currentScreen(), home);
         // A request for an id that names no screen at all.
         home->setEnabled(false);
         QVERIFY(!master.onAddScreenToStack(POPUPS_SCREEN_ID));
