@@ -218,8 +218,12 @@ void SettingsPage::clearList()
         QWidget* row = list->itemWidget(item);
         list->removeItemWidget(item);
         delete list->takeItem(0);
-        if (row)
+        if (row) {
+            // Deletion waits for the event loop, which a wait below this
+            // one does not run: out of sight at once.
+            row->hide();
             row->deleteLater();
+        }
     }
 }
 
