@@ -903,12 +903,12 @@
 <context>
     <name>SettingsFileViewerPage</name>
     <message>
-        <source>The file can&apos;t be shown.</source>
-        <translation>The file can&apos;t be shown.</translation>
+        <source>The file can't be shown.</source>
+        <translation>The file can't be shown.</translation>
     </message>
     <message>
-        <source>The file can&apos;t be read.</source>
-        <translation>The file can&apos;t be read.</translation>
+        <source>The file can't be read.</source>
+        <translation>The file can't be read.</translation>
     </message>
 </context>
 <context>
@@ -1671,8 +1671,8 @@ Diagnostics</translation>
         <translation>Job Time Elapsed</translation>
     </message>
     <message>
-        <source>The job wasn&apos;t completed within the allocated time</source>
-        <translation>The job wasn&apos;t completed within the allocated time</translation>
+        <source>The job wasn't completed within the allocated time</source>
+        <translation>The job wasn't completed within the allocated time</translation>
     </message>
     <message>
         <source>SMC force finished, all readings averaged for result.</source>

@@ -5,46 +5,46 @@
     <name>CalibrationNeededPopup</name>
     <message>
         <source>Calibration Required</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>New measurements cannot be made until the instrument is calibrated. Press Calibrate to start the calibration sequence.</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Ignore</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Calibrate</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Calibration needed within %1 %2</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>seconds</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>minutes</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>hours</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>days</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>CalibrationPopup</name>
     <message>
         <source>Calibration Starting</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Calibrating</source>
@@ -52,7 +52,7 @@
     </message>
     <message>
         <source>Do not touch or bump instrument</source>
-        <translation type="unfinished">Ne touchez pas et ne heurtez pas l&apos;instrument</translation>
+        <translation type="unfinished">Ne touchez pas et ne heurtez pas l'instrument</translation>
     </message>
     <message>
         <source>Calculating</source>
@@ -64,14 +64,14 @@
     </message>
     <message>
         <source>OK to move instrument</source>
-        <translation type="unfinished">Vous pouvez déplacer l&apos;instrument</translation>
+        <translation type="unfinished">Vous pouvez déplacer l'instrument</translation>
     </message>
 </context>
 <context>
     <name>CalibrationReferenceCheckPopup</name>
     <message>
         <source>Measurement Starting</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Measuring</source>
@@ -82,51 +82,51 @@
     <name>CalibrationReferenceWizardPageContainer</name>
     <message>
         <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>CalibrationSelfTestOtherWizardPageContainer</name>
     <message>
         <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>CalibrationSelfTestReferenceWizardPageContainer</name>
     <message>
         <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>CalibrationSelfTestWhiteWizardPageContainer</name>
     <message>
         <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>CalibrationSensorPopup</name>
     <message>
         <source>Not all pressure sensors are active. Press the OK button to start the calibration when all pressure sensors are active</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Incorrect Position</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>OK</source>
@@ -141,67 +141,67 @@
     <name>CalibrationStep2PageContents</name>
     <message>
         <source>PLACE ON A FLAT SURFACE</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>ALIGN WHITE LINE</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>CalibrationStep3PageContents</name>
     <message>
         <source>Tap the calibrate button to start calibration</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Calibrate</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>or</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Press the measurement button on the instrument</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>CalibrationWhiteWizardPageContainer</name>
     <message>
         <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Serial Number: %1</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>CalibrationWizardPage</name>
     <message>
         <source>Step 1</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Step %1</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>CalibrationWizardScreen</name>
     <message>
         <source>Calibration</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Calibrate</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Back</source>
@@ -209,11 +209,11 @@
     </message>
     <message>
         <source>Self Test %1: %2</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Reference Tile Check</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
@@ -248,7 +248,7 @@
     </message>
     <message>
         <source>The instrument was moved during a measurement</source>
-        <translation>L&apos;instrument a été déplacé pendant la mesure</translation>
+        <translation>L'instrument a été déplacé pendant la mesure</translation>
     </message>
     <message>
         <source>Index invalid</source>
@@ -256,7 +256,7 @@
     </message>
     <message>
         <source>Calibration Error</source>
-        <translation>Erreur d&apos;étalonnage</translation>
+        <translation>Erreur d'étalonnage</translation>
     </message>
     <message>
         <source>Instrument not on white tile, or internal white dirty</source>
@@ -264,7 +264,7 @@
     </message>
     <message>
         <source>Calibration data not valid</source>
-        <translation>Données d&apos;étalonnage non valides</translation>
+        <translation>Données d'étalonnage non valides</translation>
     </message>
     <message>
         <source>Not calibrated</source>
@@ -280,7 +280,7 @@
     </message>
     <message>
         <source>The measurement has been aborted by the user</source>
-        <translation>La mesure a été interrompue par l&apos;utilisateur</translation>
+        <translation>La mesure a été interrompue par l'utilisateur</translation>
     </message>
     <message>
         <source>Battery is low. Charge the battery</source>
@@ -288,11 +288,11 @@
     </message>
     <message>
         <source>Battery is empty. Instrument will shut down</source>
-        <translation>Batterie vide. L&apos;instrument va s&apos;éteindre</translation>
+        <translation>Batterie vide. L'instrument va s'éteindre</translation>
     </message>
     <message>
         <source>Error in shutter motor</source>
-        <translation>Erreur du moteur d&apos;obturateur</translation>
+        <translation>Erreur du moteur d'obturateur</translation>
     </message>
     <message>
         <source>No stored reference measurement</source>
@@ -300,11 +300,11 @@
     </message>
     <message>
         <source>Spectral integration time on white too long</source>
-        <translation>Temps d&apos;intégration spectrale sur le blanc trop long</translation>
+        <translation>Temps d'intégration spectrale sur le blanc trop long</translation>
     </message>
     <message>
         <source>Wavelength shift above absolute limit of 5 nm</source>
-        <translation>Décalage de longueur d&apos;onde au-delà de la limite de 5 nm</translation>
+        <translation>Décalage de longueur d'onde au-delà de la limite de 5 nm</translation>
     </message>
     <message>
         <source>Low Storage</source>
@@ -320,11 +320,11 @@
     </message>
     <message>
         <source>Sample temperature too high (IR Sensor)</source>
-        <translation>Température de l&apos;échantillon trop élevée (capteur IR)</translation>
+        <translation>Température de l'échantillon trop élevée (capteur IR)</translation>
     </message>
     <message>
         <source>Sample temperature too low (IR Sensor)</source>
-        <translation>Température de l&apos;échantillon trop basse (capteur IR)</translation>
+        <translation>Température de l'échantillon trop basse (capteur IR)</translation>
     </message>
     <message>
         <source>Battery level is too low for update</source>
@@ -336,11 +336,11 @@
     </message>
     <message>
         <source>Problem during initialization. Please reboot the device</source>
-        <translation>Problème lors de l&apos;initialisation. Redémarrez l&apos;appareil</translation>
+        <translation>Problème lors de l'initialisation. Redémarrez l'appareil</translation>
     </message>
     <message>
         <source>Hardware communication error. Please reboot the device</source>
-        <translation>Erreur de communication matérielle. Redémarrez l&apos;appareil</translation>
+        <translation>Erreur de communication matérielle. Redémarrez l'appareil</translation>
     </message>
     <message>
         <source>Error during measurement</source>
@@ -363,11 +363,11 @@
     <name>DeleteAllSamplesPopup</name>
     <message>
         <source>Clear Database</source>
-        <translation type="unfinished"></translation>
+        <translation>Effacer la base de données</translation>
     </message>
     <message>
         <source>Are you sure you want to clear the database, this will delete all samples and jobs from the instrument?</source>
-        <translation type="unfinished"></translation>
+        <translation>Voulez-vous vraiment effacer la base de données ? Tous les échantillons et travaux de l'instrument seront supprimés.</translation>
     </message>
 </context>
 <context>
@@ -389,7 +389,7 @@
     <name>DeleteSamplePopup</name>
     <message>
         <source>Delete Sample?</source>
-        <translation>Supprimer l&apos;échantillon ?</translation>
+        <translation>Supprimer l'échantillon ?</translation>
     </message>
     <message>
         <source>Delete</source>
@@ -438,7 +438,7 @@
     <name>JobFreeTextEditScreen</name>
     <message>
         <source>Notes</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
@@ -449,11 +449,11 @@
     </message>
     <message>
         <source>ABC</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Special Keys</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
@@ -515,7 +515,7 @@
     </message>
     <message>
         <source>A new job cannot be created until one or more existing jobs are removed from the instrument.</source>
-        <translation>Impossible de créer un travail tant qu&apos;un ou plusieurs travaux n&apos;ont pas été supprimés de l&apos;instrument.</translation>
+        <translation>Impossible de créer un travail tant qu'un ou plusieurs travaux n'ont pas été supprimés de l'instrument.</translation>
     </message>
     <message>
         <source>There is not enough memory to complete the requested Job. Please remove existing jobs to free up memory.</source>
@@ -590,7 +590,7 @@
     </message>
     <message>
         <source>This job was not created on the instrument. Are you sure you want to edit the job?</source>
-        <translation>Ce travail n&apos;a pas été créé sur l&apos;instrument. Voulez-vous vraiment le modifier ?</translation>
+        <translation>Ce travail n'a pas été créé sur l'instrument. Voulez-vous vraiment le modifier ?</translation>
     </message>
     <message>
         <source>Edit</source>
@@ -605,34 +605,34 @@
     <name>JobNameEditScreen</name>
     <message>
         <source>Name</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Job Name cannot be empty</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Enter a unique job name that is not empty</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Job Name Already Exists</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>This job name already exists.  Please change the name to a unique name</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>JobTagEditScreen</name>
     <message>
         <source>Tag Name Does Not Exist</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>This tag name does not exist. Please change the name to an existing tag name</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
@@ -643,7 +643,7 @@
     </message>
     <message>
         <source>ABC</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
@@ -665,7 +665,7 @@
     </message>
     <message>
         <source>Do not touch or bump instrument</source>
-        <translation>Ne touchez pas et ne heurtez pas l&apos;instrument</translation>
+        <translation>Ne touchez pas et ne heurtez pas l'instrument</translation>
     </message>
     <message>
         <source>Calculating</source>
@@ -673,7 +673,7 @@
     </message>
     <message>
         <source>OK to move instrument</source>
-        <translation>Vous pouvez déplacer l&apos;instrument</translation>
+        <translation>Vous pouvez déplacer l'instrument</translation>
     </message>
 </context>
 <context>
@@ -695,15 +695,15 @@
     <name>RestoreFactorySettingsPopup</name>
     <message>
         <source>Confirm by moving the dot around the circle</source>
-        <translation type="unfinished"></translation>
+        <translation>Confirmez en faisant le tour du cercle avec le point</translation>
     </message>
     <message>
         <source>Restore Factory Settings</source>
-        <translation type="unfinished"></translation>
+        <translation>Rétablir les paramètres d'usine</translation>
     </message>
     <message>
         <source>All current user settings will go back to defaults. Any jobs or samples will also be lost!</source>
-        <translation type="unfinished"></translation>
+        <translation>Tous les paramètres reviendront aux valeurs par défaut. Les travaux et les échantillons seront également perdus !</translation>
     </message>
 </context>
 <context>
@@ -714,7 +714,7 @@
     </message>
     <message>
         <source>An error has occurred, please reboot the instrument</source>
-        <translation>Une erreur s&apos;est produite. Redémarrez l&apos;instrument</translation>
+        <translation>Une erreur s'est produite. Redémarrez l'instrument</translation>
     </message>
     <message>
         <source>OK</source>
@@ -753,7 +753,7 @@
     <name>SampleListSelectionItemComplete</name>
     <message>
         <source>More measurements are needed to complete this job</source>
-        <translation>D&apos;autres mesures sont nécessaires pour terminer ce travail</translation>
+        <translation>D'autres mesures sont nécessaires pour terminer ce travail</translation>
     </message>
 </context>
 <context>
@@ -782,15 +782,15 @@
     <name>SelfTestListItem</name>
     <message>
         <source>Pass</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Fail</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Canceled</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Error</source>
@@ -801,11 +801,11 @@
     <name>SelfTestPopup</name>
     <message>
         <source>Hold the instrument in open air</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Do not touch or bump instrument</source>
-        <translation type="unfinished">Ne touchez pas et ne heurtez pas l&apos;instrument</translation>
+        <translation type="unfinished">Ne touchez pas et ne heurtez pas l'instrument</translation>
     </message>
     <message>
         <source>Complete</source>
@@ -816,7 +816,7 @@
     <name>SelfTestScreen</name>
     <message>
         <source>Self Test</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>OK</source>
@@ -824,262 +824,264 @@
     </message>
     <message>
         <source>White Calibration</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Reference check on white</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Effect tile test</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Repeatability tests</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Temperature tests</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Pressure sensor test</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Check error logs</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Testing...</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>All Tests Complete</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Self Tests Canceled</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>SettingsDatabaseMemoryPage</name>
     <message>
         <source>Database / Memory</source>
-        <translation type="unfinished"></translation>
+        <translation>Base de données / mémoire</translation>
     </message>
     <message>
         <source>Samples</source>
-        <translation type="unfinished"></translation>
+        <translation>Échantillons</translation>
     </message>
     <message>
         <source>Jobs</source>
-        <translation type="unfinished">Travaux</translation>
+        <translation>Travaux</translation>
     </message>
     <message>
         <source>Clear Database</source>
-        <translation type="unfinished"></translation>
+        <translation>Effacer la base de données</translation>
     </message>
 </context>
 <context>
     <name>SettingsDirectoryExplorerPage</name>
     <message>
         <source>No files</source>
-        <translation type="unfinished"></translation>
+        <translation>Aucun fichier</translation>
     </message>
 </context>
 <context>
     <name>SettingsDisplayPage</name>
     <message>
         <source>Display Settings</source>
-        <translation type="unfinished"></translation>
+        <translation>Affichage</translation>
     </message>
     <message>
         <source>Display Brightness</source>
-        <translation type="unfinished"></translation>
+        <translation>Luminosité de l'écran</translation>
     </message>
 </context>
 <context>
     <name>SettingsFileViewerPage</name>
     <message>
-        <source>The file can&apos;t be shown.</source>
-        <translation type="unfinished"></translation>
+        <source>The file can't be shown.</source>
+        <translation>Impossible d'afficher le fichier.</translation>
     </message>
     <message>
-        <source>The file can&apos;t be read.</source>
-        <translation type="unfinished"></translation>
+        <source>The file can't be read.</source>
+        <translation>Impossible de lire le fichier.</translation>
     </message>
 </context>
 <context>
     <name>SettingsLanguagePage</name>
     <message>
         <source>Language</source>
-        <translation type="unfinished"></translation>
+        <translation>Langue</translation>
     </message>
 </context>
 <context>
     <name>SettingsLegalInformationPage</name>
     <message>
         <source>Legal Information</source>
-        <translation type="unfinished"></translation>
+        <translation>Informations légales</translation>
     </message>
 </context>
 <context>
     <name>SettingsListSelectionPowerInfo</name>
     <message>
         <source>%1 hour </source>
-        <translation type="unfinished"></translation>
+        <translation>%1 heure </translation>
     </message>
     <message>
         <source>%1 hours </source>
-        <translation type="unfinished"></translation>
+        <translation>%1 heures </translation>
     </message>
     <message>
         <source>%1 minutes and </source>
-        <translation type="unfinished"></translation>
+        <translation>%1 minutes et </translation>
     </message>
     <message>
         <source>%1 seconds</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 secondes</translation>
     </message>
     <message>
         <source>Never</source>
-        <translation type="unfinished"></translation>
+        <translation>Jamais</translation>
     </message>
     <message>
         <source>Display dims after: %1
 Standby after: %2
 Power off after: %3</source>
-        <translation type="unfinished"></translation>
+        <translation>Atténuation après : %1
+Veille après : %2
+Arrêt après : %3</translation>
     </message>
 </context>
 <context>
     <name>SettingsListSelectionProgressItem</name>
     <message>
         <source>%1%</source>
-        <translation type="unfinished">%1 : {1%?}</translation>
+        <translation>%1 %</translation>
     </message>
     <message>
         <source>%1 of %2</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 sur %2</translation>
     </message>
 </context>
 <context>
     <name>SettingsListSelectionSliderItem</name>
     <message>
         <source>Never</source>
-        <translation type="unfinished"></translation>
+        <translation>Jamais</translation>
     </message>
 </context>
 <context>
     <name>SettingsMainPage</name>
     <message>
         <source>Settings</source>
-        <translation type="unfinished"></translation>
+        <translation>Paramètres</translation>
     </message>
     <message>
         <source>Valid</source>
-        <translation type="unfinished"></translation>
+        <translation>Valide</translation>
     </message>
     <message>
         <source>Expired</source>
-        <translation type="unfinished"></translation>
+        <translation>Expirée</translation>
     </message>
     <message>
         <source>Not Connected</source>
-        <translation type="unfinished"></translation>
+        <translation>Non connecté</translation>
     </message>
     <message>
         <source>%1</source>
-        <translation type="unfinished">%1 : {1?}</translation>
+        <translation>%1</translation>
     </message>
     <message>
         <source>%1%</source>
-        <translation type="unfinished">%1 : {1%?}</translation>
+        <translation>%1 %</translation>
     </message>
     <message>
         <source>Power</source>
-        <translation type="unfinished"></translation>
+        <translation>Alimentation</translation>
     </message>
     <message>
         <source>Language</source>
-        <translation type="unfinished"></translation>
+        <translation>Langue</translation>
     </message>
     <message>
         <source>Calibration</source>
-        <translation type="unfinished"></translation>
+        <translation>Étalonnage</translation>
     </message>
     <message>
         <source>Measurement Options</source>
-        <translation type="unfinished"></translation>
+        <translation>Options de mesure</translation>
     </message>
     <message>
         <source>Wi-Fi</source>
-        <translation type="unfinished"></translation>
+        <translation>Wi-Fi</translation>
     </message>
     <message>
         <source>Display Settings</source>
-        <translation type="unfinished"></translation>
+        <translation>Affichage</translation>
     </message>
     <message>
         <source>Beeper Volume</source>
-        <translation type="unfinished"></translation>
+        <translation>Volume du bip</translation>
     </message>
     <message>
         <source>Power Saving Options</source>
-        <translation type="unfinished"></translation>
+        <translation>Économie d'énergie</translation>
     </message>
     <message>
         <source>System &amp; Diagnostics</source>
-        <translation type="unfinished"></translation>
+        <translation>Système et diagnostic</translation>
     </message>
 </context>
 <context>
     <name>SettingsMeasurementPage</name>
     <message>
         <source>On</source>
-        <translation type="unfinished"></translation>
+        <translation>Activé</translation>
     </message>
     <message>
         <source>Off</source>
-        <translation type="unfinished"></translation>
+        <translation>Désactivé</translation>
     </message>
     <message>
         <source>Measurement Options</source>
-        <translation type="unfinished"></translation>
+        <translation>Options de mesure</translation>
     </message>
     <message>
         <source>Auto Measurement</source>
-        <translation type="unfinished"></translation>
+        <translation>Mesure automatique</translation>
     </message>
     <message>
         <source>Time to start auto measurement (sec):</source>
-        <translation type="unfinished"></translation>
+        <translation>Délai avant la mesure automatique (s) :</translation>
     </message>
     <message>
         <source>Measurement Mode</source>
-        <translation type="unfinished"></translation>
+        <translation>Mode de mesure</translation>
     </message>
     <message>
         <source>No. of good measurements required:</source>
-        <translation type="unfinished"></translation>
+        <translation>Nombre de mesures valides requises :</translation>
     </message>
     <message>
         <source>Maximum measurements:</source>
-        <translation type="unfinished"></translation>
+        <translation>Nombre maximal de mesures :</translation>
     </message>
     <message>
         <source>Auto Measurements: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Mesures automatiques : %1</translation>
     </message>
     <message>
         <source>Display LABCH: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Afficher LABCH : %1</translation>
     </message>
     <message>
         <source>Override Pressure Sensors: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Ignorer les capteurs de pression : %1</translation>
     </message>
 </context>
 <context>
@@ -1087,78 +1089,79 @@ Power off after: %3</source>
     <message>
         <source>Power Saving
 Options</source>
-        <translation type="unfinished"></translation>
+        <translation>Économie
+d'énergie</translation>
     </message>
     <message>
         <source>Dim Display</source>
-        <translation type="unfinished"></translation>
+        <translation>Atténuer l'écran</translation>
     </message>
     <message>
         <source>Standby Mode</source>
-        <translation type="unfinished"></translation>
+        <translation>Mode veille</translation>
     </message>
     <message>
         <source>Power Off</source>
-        <translation type="unfinished">Éteindre</translation>
+        <translation>Éteindre</translation>
     </message>
     <message>
         <source>Seconds until display dims:</source>
-        <translation type="unfinished"></translation>
+        <translation>Secondes avant atténuation :</translation>
     </message>
     <message>
         <source>Minutes until standby mode:</source>
-        <translation type="unfinished"></translation>
+        <translation>Minutes avant la veille :</translation>
     </message>
     <message>
         <source>Minutes until power off:</source>
-        <translation type="unfinished"></translation>
+        <translation>Minutes avant l'arrêt :</translation>
     </message>
 </context>
 <context>
     <name>SettingsPowerPage</name>
     <message>
         <source>Power</source>
-        <translation type="unfinished"></translation>
+        <translation>Alimentation</translation>
     </message>
     <message>
         <source>Power Off</source>
-        <translation type="unfinished">Éteindre</translation>
+        <translation>Éteindre</translation>
     </message>
     <message>
         <source>Reboot</source>
-        <translation type="unfinished">Redémarrer</translation>
+        <translation>Redémarrer</translation>
     </message>
     <message>
         <source>Shutdown Instrument?</source>
-        <translation type="unfinished"></translation>
+        <translation>Éteindre l'instrument ?</translation>
     </message>
     <message>
         <source>Are you sure you want to shutdown the instrument?</source>
-        <translation type="unfinished"></translation>
+        <translation>Voulez-vous vraiment éteindre l'instrument ?</translation>
     </message>
     <message>
         <source>Enter Standby Mode?</source>
-        <translation type="unfinished"></translation>
+        <translation>Passer en veille ?</translation>
     </message>
     <message>
         <source>Are you sure you want to put the instrument into standby mode?</source>
-        <translation type="unfinished"></translation>
+        <translation>Voulez-vous vraiment mettre l'instrument en veille ?</translation>
     </message>
     <message>
         <source>Reboot Instrument?</source>
-        <translation type="unfinished"></translation>
+        <translation>Redémarrer l'instrument ?</translation>
     </message>
     <message>
         <source>Are you sure you want to reboot the instrument?</source>
-        <translation type="unfinished"></translation>
+        <translation>Voulez-vous vraiment redémarrer l'instrument ?</translation>
     </message>
     <message>
         <source>Yes</source>
-        <translation type="unfinished"></translation>
+        <translation>Oui</translation>
     </message>
     <message>
         <source>No</source>
-        <translation type="unfinished">Non</translation>
+        <translation>Non</translation>
     </message>
 </context>
 <context>
@@ -1166,148 +1169,149 @@ Options</source>
     <message>
         <source>System &amp;
 Diagnostics</source>
-        <translation type="unfinished"></translation>
+        <translation>Système et
+diagnostic</translation>
     </message>
     <message>
         <source>System Information</source>
-        <translation type="unfinished"></translation>
+        <translation>Informations système</translation>
     </message>
     <message>
         <source>Database / Memory</source>
-        <translation type="unfinished"></translation>
+        <translation>Base de données / mémoire</translation>
     </message>
     <message>
         <source>Legal Information</source>
-        <translation type="unfinished"></translation>
+        <translation>Informations légales</translation>
     </message>
     <message>
         <source>Self Test</source>
-        <translation type="unfinished"></translation>
+        <translation>Autotest</translation>
     </message>
 </context>
 <context>
     <name>SettingsSystemInformationPage</name>
     <message>
         <source>System Information</source>
-        <translation type="unfinished"></translation>
+        <translation>Informations système</translation>
     </message>
     <message>
         <source>Not Configured</source>
-        <translation type="unfinished"></translation>
+        <translation>Non configuré</translation>
     </message>
     <message>
         <source>Instrument Model:</source>
-        <translation type="unfinished"></translation>
+        <translation>Modèle :</translation>
     </message>
     <message>
         <source>Instrument Serial:</source>
-        <translation type="unfinished"></translation>
+        <translation>N° de série :</translation>
     </message>
     <message>
         <source>Part Number:</source>
-        <translation type="unfinished"></translation>
+        <translation>Référence :</translation>
     </message>
     <message>
         <source>White Reference Tile:</source>
-        <translation type="unfinished"></translation>
+        <translation>Étalon blanc :</translation>
     </message>
     <message>
         <source>Certification Date:</source>
-        <translation type="unfinished"></translation>
+        <translation>Date de certification :</translation>
     </message>
     <message>
         <source>Firmware Revision:</source>
-        <translation type="unfinished"></translation>
+        <translation>Version du micrologiciel :</translation>
     </message>
     <message>
         <source>Interface Revision:</source>
-        <translation type="unfinished"></translation>
+        <translation>Version de l'interface :</translation>
     </message>
     <message>
         <source>Kernel:</source>
-        <translation type="unfinished"></translation>
+        <translation>Noyau :</translation>
     </message>
     <message>
         <source>Bootloader:</source>
-        <translation type="unfinished"></translation>
+        <translation>Chargeur d'amorçage :</translation>
     </message>
     <message>
         <source>Server URL:</source>
-        <translation type="unfinished"></translation>
+        <translation>URL du serveur :</translation>
     </message>
     <message>
         <source>Restore Factory Settings</source>
-        <translation type="unfinished"></translation>
+        <translation>Rétablir les paramètres d'usine</translation>
     </message>
     <message>
         <source>Open Source</source>
-        <translation type="unfinished"></translation>
+        <translation>Logiciels libres</translation>
     </message>
     <message>
         <source>Burn in BIRCH JuniperX/Juniper</source>
-        <translation type="unfinished"></translation>
+        <translation>Burn in BIRCH JuniperX/Juniper</translation>
     </message>
     <message>
         <source>Burn in ALDER Larch</source>
-        <translation type="unfinished"></translation>
+        <translation>Burn in ALDER Larch</translation>
     </message>
     <message>
         <source>Burn in Spruce / Sequoia</source>
-        <translation type="unfinished"></translation>
+        <translation>Burn in Spruce / Sequoia</translation>
     </message>
 </context>
 <context>
     <name>SettingsVolumePage</name>
     <message>
         <source>Beeper Volume</source>
-        <translation type="unfinished"></translation>
+        <translation>Volume du bip</translation>
     </message>
 </context>
 <context>
     <name>SettingsWifiPage</name>
     <message>
         <source>Wi-Fi</source>
-        <translation type="unfinished"></translation>
+        <translation>Wi-Fi</translation>
     </message>
     <message>
         <source>On</source>
-        <translation type="unfinished"></translation>
+        <translation>Activé</translation>
     </message>
     <message>
         <source>Off</source>
-        <translation type="unfinished"></translation>
+        <translation>Désactivé</translation>
     </message>
     <message>
         <source>Static IP</source>
-        <translation type="unfinished"></translation>
+        <translation>IP statique</translation>
     </message>
     <message>
         <source>DHCP</source>
-        <translation type="unfinished"></translation>
+        <translation>DHCP</translation>
     </message>
     <message>
         <source>Known Networks</source>
-        <translation type="unfinished"></translation>
+        <translation>Réseaux connus</translation>
     </message>
     <message>
         <source>Unknown Networks</source>
-        <translation type="unfinished"></translation>
+        <translation>Réseaux disponibles</translation>
     </message>
     <message>
         <source>Connection Issue</source>
-        <translation type="unfinished"></translation>
+        <translation>Problème de connexion</translation>
     </message>
     <message>
         <source>Incorrect password</source>
-        <translation type="unfinished"></translation>
+        <translation>Mot de passe incorrect</translation>
     </message>
     <message>
         <source>Network not in range</source>
-        <translation type="unfinished"></translation>
+        <translation>Réseau hors de portée</translation>
     </message>
     <message>
         <source>OK</source>
-        <translation type="unfinished">OK</translation>
+        <translation>OK</translation>
     </message>
 </context>
 <context>
@@ -1552,19 +1556,19 @@ Diagnostics</source>
     <name>TargetingScreen</name>
     <message>
         <source>Job</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Press button to measure.</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Targeting</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Averaged 0 of SMC 0:0</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Measure</source>
@@ -1572,15 +1576,15 @@ Diagnostics</source>
     </message>
     <message>
         <source>Terminate</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Online Mode</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Averaged %1 of SMC %2:%3</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>OK</source>
@@ -1588,27 +1592,27 @@ Diagnostics</source>
     </message>
     <message>
         <source>Exit Online Mode?</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Exiting online mode will stop targeting and return to the job list.</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Exit</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Stop Measuring?</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>All measured samples and this job will be permanently deleted.</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>All measured samples from this job will be permanently deleted.</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Warning</source>
@@ -1616,19 +1620,19 @@ Diagnostics</source>
     </message>
     <message>
         <source>Continue</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Temperature out of range.  Continue online mode until complete, or Exit online mode and return to the job list?</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Temperature out of range.  Continue job until complete, or delete job and all samples and return to the job list?</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Temperature out of range.  Continue job until complete, or delete all samples and return to the job list?</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Delete</source>
@@ -1636,11 +1640,11 @@ Diagnostics</source>
     </message>
     <message>
         <source>Override Pressure Sensors?</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Not all pressure sensors are active. Press the measure button again to start a measurement, otherwise press the cancel button to return to targeting mode.</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Cancel</source>
@@ -1648,35 +1652,35 @@ Diagnostics</source>
     </message>
     <message>
         <source>Information</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Not all pressure sensors are active. Please ensure all pressure sensors are active before measuring</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Continue Measuring?</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>To continue with measurements, press OK</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Job Time Elapsed</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
-        <source>The job wasn&apos;t completed within the allocated time</source>
-        <translation type="unfinished"></translation>
+        <source>The job wasn't completed within the allocated time</source>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>SMC force finished, all readings averaged for result.</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Maximum number of SMC measurements used for this job</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Complete</source>
@@ -1684,15 +1688,15 @@ Diagnostics</source>
     </message>
     <message>
         <source>The job has completed.  Press OK to exit online mode</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>SMC force finished, all readings averaged for result.  Press OK to exit online mode</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>SMC failed after maximum measurements %1, the final results are averaged.  Press OK to exit online mode</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
@@ -1714,7 +1718,7 @@ Diagnostics</source>
     <name>UndoPopup</name>
     <message>
         <source>Undo</source>
-        <translation>Annuler l&apos;action</translation>
+        <translation>Annuler l'action</translation>
     </message>
     <message>
         <source>Back</source>
@@ -1732,15 +1736,15 @@ Diagnostics</source>
     <name>WifiPasswordScreen</name>
     <message>
         <source>Password</source>
-        <translation type="unfinished"></translation>
+        <translation>Mot de passe</translation>
     </message>
     <message>
         <source>ABC</source>
-        <translation type="unfinished"></translation>
+        <translation>ABC</translation>
     </message>
     <message>
         <source>@&amp;*</source>
-        <translation type="unfinished"></translation>
+        <translation>@&amp;*</translation>
     </message>
 </context>
 </TS>

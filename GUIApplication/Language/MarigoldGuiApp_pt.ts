@@ -5,46 +5,46 @@
     <name>CalibrationNeededPopup</name>
     <message>
         <source>Calibration Required</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>New measurements cannot be made until the instrument is calibrated. Press Calibrate to start the calibration sequence.</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Ignore</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Calibrate</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Calibration needed within %1 %2</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>seconds</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>minutes</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>hours</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>days</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>CalibrationPopup</name>
     <message>
         <source>Calibration Starting</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Calibrating</source>
@@ -71,7 +71,7 @@
     <name>CalibrationReferenceCheckPopup</name>
     <message>
         <source>Measurement Starting</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Measuring</source>
@@ -82,51 +82,51 @@
     <name>CalibrationReferenceWizardPageContainer</name>
     <message>
         <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>CalibrationSelfTestOtherWizardPageContainer</name>
     <message>
         <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>CalibrationSelfTestReferenceWizardPageContainer</name>
     <message>
         <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>CalibrationSelfTestWhiteWizardPageContainer</name>
     <message>
         <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>CalibrationSensorPopup</name>
     <message>
         <source>Not all pressure sensors are active. Press the OK button to start the calibration when all pressure sensors are active</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Incorrect Position</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>OK</source>
@@ -141,67 +141,67 @@
     <name>CalibrationStep2PageContents</name>
     <message>
         <source>PLACE ON A FLAT SURFACE</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>ALIGN WHITE LINE</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>CalibrationStep3PageContents</name>
     <message>
         <source>Tap the calibrate button to start calibration</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Calibrate</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>or</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Press the measurement button on the instrument</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>CalibrationWhiteWizardPageContainer</name>
     <message>
         <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Serial Number: %1</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>CalibrationWizardPage</name>
     <message>
         <source>Step 1</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Step %1</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>CalibrationWizardScreen</name>
     <message>
         <source>Calibration</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Calibrate</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Back</source>
@@ -209,11 +209,11 @@
     </message>
     <message>
         <source>Self Test %1: %2</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Reference Tile Check</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
@@ -363,11 +363,11 @@
     <name>DeleteAllSamplesPopup</name>
     <message>
         <source>Clear Database</source>
-        <translation type="unfinished"></translation>
+        <translation>Limpar banco de dados</translation>
     </message>
     <message>
         <source>Are you sure you want to clear the database, this will delete all samples and jobs from the instrument?</source>
-        <translation type="unfinished"></translation>
+        <translation>Tem certeza de que deseja limpar o banco de dados? Todas as amostras e trabalhos do instrumento serão excluídos.</translation>
     </message>
 </context>
 <context>
@@ -438,7 +438,7 @@
     <name>JobFreeTextEditScreen</name>
     <message>
         <source>Notes</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
@@ -449,11 +449,11 @@
     </message>
     <message>
         <source>ABC</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Special Keys</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
@@ -605,34 +605,34 @@
     <name>JobNameEditScreen</name>
     <message>
         <source>Name</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Job Name cannot be empty</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Enter a unique job name that is not empty</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Job Name Already Exists</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>This job name already exists.  Please change the name to a unique name</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>JobTagEditScreen</name>
     <message>
         <source>Tag Name Does Not Exist</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>This tag name does not exist. Please change the name to an existing tag name</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
@@ -643,7 +643,7 @@
     </message>
     <message>
         <source>ABC</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
@@ -695,15 +695,15 @@
     <name>RestoreFactorySettingsPopup</name>
     <message>
         <source>Confirm by moving the dot around the circle</source>
-        <translation type="unfinished"></translation>
+        <translation>Confirme girando o ponto ao redor do círculo</translation>
     </message>
     <message>
         <source>Restore Factory Settings</source>
-        <translation type="unfinished"></translation>
+        <translation>Restaurar configurações de fábrica</translation>
     </message>
     <message>
         <source>All current user settings will go back to defaults. Any jobs or samples will also be lost!</source>
-        <translation type="unfinished"></translation>
+        <translation>Todas as configurações voltarão ao padrão. Os trabalhos e as amostras também serão perdidos!</translation>
     </message>
 </context>
 <context>
@@ -782,15 +782,15 @@
     <name>SelfTestListItem</name>
     <message>
         <source>Pass</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Fail</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Canceled</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Error</source>
@@ -801,7 +801,7 @@
     <name>SelfTestPopup</name>
     <message>
         <source>Hold the instrument in open air</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Do not touch or bump instrument</source>
@@ -816,7 +816,7 @@
     <name>SelfTestScreen</name>
     <message>
         <source>Self Test</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>OK</source>
@@ -824,262 +824,264 @@
     </message>
     <message>
         <source>White Calibration</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Reference check on white</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Effect tile test</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Repeatability tests</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Temperature tests</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Pressure sensor test</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Check error logs</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Testing...</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>All Tests Complete</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Self Tests Canceled</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
     <name>SettingsDatabaseMemoryPage</name>
     <message>
         <source>Database / Memory</source>
-        <translation type="unfinished"></translation>
+        <translation>Banco de dados / memória</translation>
     </message>
     <message>
         <source>Samples</source>
-        <translation type="unfinished"></translation>
+        <translation>Amostras</translation>
     </message>
     <message>
         <source>Jobs</source>
-        <translation type="unfinished">Trabalhos</translation>
+        <translation>Trabalhos</translation>
     </message>
     <message>
         <source>Clear Database</source>
-        <translation type="unfinished"></translation>
+        <translation>Limpar banco de dados</translation>
     </message>
 </context>
 <context>
     <name>SettingsDirectoryExplorerPage</name>
     <message>
         <source>No files</source>
-        <translation type="unfinished"></translation>
+        <translation>Nenhum arquivo</translation>
     </message>
 </context>
 <context>
     <name>SettingsDisplayPage</name>
     <message>
         <source>Display Settings</source>
-        <translation type="unfinished"></translation>
+        <translation>Tela</translation>
     </message>
     <message>
         <source>Display Brightness</source>
-        <translation type="unfinished"></translation>
+        <translation>Brilho da tela</translation>
     </message>
 </context>
 <context>
     <name>SettingsFileViewerPage</name>
     <message>
-        <source>The file can&apos;t be shown.</source>
-        <translation type="unfinished"></translation>
+        <source>The file can't be shown.</source>
+        <translation>Não é possível mostrar o arquivo.</translation>
     </message>
     <message>
-        <source>The file can&apos;t be read.</source>
-        <translation type="unfinished"></translation>
+        <source>The file can't be read.</source>
+        <translation>Não é possível ler o arquivo.</translation>
     </message>
 </context>
 <context>
     <name>SettingsLanguagePage</name>
     <message>
         <source>Language</source>
-        <translation type="unfinished"></translation>
+        <translation>Idioma</translation>
     </message>
 </context>
 <context>
     <name>SettingsLegalInformationPage</name>
     <message>
         <source>Legal Information</source>
-        <translation type="unfinished"></translation>
+        <translation>Informações legais</translation>
     </message>
 </context>
 <context>
     <name>SettingsListSelectionPowerInfo</name>
     <message>
         <source>%1 hour </source>
-        <translation type="unfinished"></translation>
+        <translation>%1 hora </translation>
     </message>
     <message>
         <source>%1 hours </source>
-        <translation type="unfinished"></translation>
+        <translation>%1 horas </translation>
     </message>
     <message>
         <source>%1 minutes and </source>
-        <translation type="unfinished"></translation>
+        <translation>%1 minutos e </translation>
     </message>
     <message>
         <source>%1 seconds</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 segundos</translation>
     </message>
     <message>
         <source>Never</source>
-        <translation type="unfinished"></translation>
+        <translation>Nunca</translation>
     </message>
     <message>
         <source>Display dims after: %1
 Standby after: %2
 Power off after: %3</source>
-        <translation type="unfinished"></translation>
+        <translation>Escurecer após: %1
+Espera após: %2
+Desligar após: %3</translation>
     </message>
 </context>
 <context>
     <name>SettingsListSelectionProgressItem</name>
     <message>
         <source>%1%</source>
-        <translation type="unfinished">%1: {1%?}</translation>
+        <translation>%1%</translation>
     </message>
     <message>
         <source>%1 of %2</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 de %2</translation>
     </message>
 </context>
 <context>
     <name>SettingsListSelectionSliderItem</name>
     <message>
         <source>Never</source>
-        <translation type="unfinished"></translation>
+        <translation>Nunca</translation>
     </message>
 </context>
 <context>
     <name>SettingsMainPage</name>
     <message>
         <source>Settings</source>
-        <translation type="unfinished"></translation>
+        <translation>Configurações</translation>
     </message>
     <message>
         <source>Valid</source>
-        <translation type="unfinished"></translation>
+        <translation>Válida</translation>
     </message>
     <message>
         <source>Expired</source>
-        <translation type="unfinished"></translation>
+        <translation>Expirada</translation>
     </message>
     <message>
         <source>Not Connected</source>
-        <translation type="unfinished"></translation>
+        <translation>Não conectado</translation>
     </message>
     <message>
         <source>%1</source>
-        <translation type="unfinished">%1: {1?}</translation>
+        <translation>%1</translation>
     </message>
     <message>
         <source>%1%</source>
-        <translation type="unfinished">%1: {1%?}</translation>
+        <translation>%1%</translation>
     </message>
     <message>
         <source>Power</source>
-        <translation type="unfinished"></translation>
+        <translation>Energia</translation>
     </message>
     <message>
         <source>Language</source>
-        <translation type="unfinished"></translation>
+        <translation>Idioma</translation>
     </message>
     <message>
         <source>Calibration</source>
-        <translation type="unfinished"></translation>
+        <translation>Calibração</translation>
     </message>
     <message>
         <source>Measurement Options</source>
-        <translation type="unfinished"></translation>
+        <translation>Opções de medição</translation>
     </message>
     <message>
         <source>Wi-Fi</source>
-        <translation type="unfinished"></translation>
+        <translation>Wi-Fi</translation>
     </message>
     <message>
         <source>Display Settings</source>
-        <translation type="unfinished"></translation>
+        <translation>Tela</translation>
     </message>
     <message>
         <source>Beeper Volume</source>
-        <translation type="unfinished"></translation>
+        <translation>Volume do bipe</translation>
     </message>
     <message>
         <source>Power Saving Options</source>
-        <translation type="unfinished"></translation>
+        <translation>Economia de energia</translation>
     </message>
     <message>
         <source>System &amp; Diagnostics</source>
-        <translation type="unfinished"></translation>
+        <translation>Sistema e diagnóstico</translation>
     </message>
 </context>
 <context>
     <name>SettingsMeasurementPage</name>
     <message>
         <source>On</source>
-        <translation type="unfinished"></translation>
+        <translation>Ligado</translation>
     </message>
     <message>
         <source>Off</source>
-        <translation type="unfinished"></translation>
+        <translation>Desligado</translation>
     </message>
     <message>
         <source>Measurement Options</source>
-        <translation type="unfinished"></translation>
+        <translation>Opções de medição</translation>
     </message>
     <message>
         <source>Auto Measurement</source>
-        <translation type="unfinished"></translation>
+        <translation>Medição automática</translation>
     </message>
     <message>
         <source>Time to start auto measurement (sec):</source>
-        <translation type="unfinished"></translation>
+        <translation>Tempo até a medição automática (s):</translation>
     </message>
     <message>
         <source>Measurement Mode</source>
-        <translation type="unfinished"></translation>
+        <translation>Modo de medição</translation>
     </message>
     <message>
         <source>No. of good measurements required:</source>
-        <translation type="unfinished"></translation>
+        <translation>N.º de medições válidas necessárias:</translation>
     </message>
     <message>
         <source>Maximum measurements:</source>
-        <translation type="unfinished"></translation>
+        <translation>Máximo de medições:</translation>
     </message>
     <message>
         <source>Auto Measurements: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Medições automáticas: %1</translation>
     </message>
     <message>
         <source>Display LABCH: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Mostrar LABCH: %1</translation>
     </message>
     <message>
         <source>Override Pressure Sensors: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Ignorar sensores de pressão: %1</translation>
     </message>
 </context>
 <context>
@@ -1087,78 +1089,79 @@ Power off after: %3</source>
     <message>
         <source>Power Saving
 Options</source>
-        <translation type="unfinished"></translation>
+        <translation>Economia
+de energia</translation>
     </message>
     <message>
         <source>Dim Display</source>
-        <translation type="unfinished"></translation>
+        <translation>Escurecer tela</translation>
     </message>
     <message>
         <source>Standby Mode</source>
-        <translation type="unfinished"></translation>
+        <translation>Modo de espera</translation>
     </message>
     <message>
         <source>Power Off</source>
-        <translation type="unfinished">Desligar</translation>
+        <translation>Desligar</translation>
     </message>
     <message>
         <source>Seconds until display dims:</source>
-        <translation type="unfinished"></translation>
+        <translation>Segundos até escurecer a tela:</translation>
     </message>
     <message>
         <source>Minutes until standby mode:</source>
-        <translation type="unfinished"></translation>
+        <translation>Minutos até o modo de espera:</translation>
     </message>
     <message>
         <source>Minutes until power off:</source>
-        <translation type="unfinished"></translation>
+        <translation>Minutos até desligar:</translation>
     </message>
 </context>
 <context>
     <name>SettingsPowerPage</name>
     <message>
         <source>Power</source>
-        <translation type="unfinished"></translation>
+        <translation>Energia</translation>
     </message>
     <message>
         <source>Power Off</source>
-        <translation type="unfinished">Desligar</translation>
+        <translation>Desligar</translation>
     </message>
     <message>
         <source>Reboot</source>
-        <translation type="unfinished">Reiniciar</translation>
+        <translation>Reiniciar</translation>
     </message>
     <message>
         <source>Shutdown Instrument?</source>
-        <translation type="unfinished"></translation>
+        <translation>Desligar o instrumento?</translation>
     </message>
     <message>
         <source>Are you sure you want to shutdown the instrument?</source>
-        <translation type="unfinished"></translation>
+        <translation>Tem certeza de que deseja desligar o instrumento?</translation>
     </message>
     <message>
         <source>Enter Standby Mode?</source>
-        <translation type="unfinished"></translation>
+        <translation>Entrar em espera?</translation>
     </message>
     <message>
         <source>Are you sure you want to put the instrument into standby mode?</source>
-        <translation type="unfinished"></translation>
+        <translation>Tem certeza de que deseja colocar o instrumento em espera?</translation>
     </message>
     <message>
         <source>Reboot Instrument?</source>
-        <translation type="unfinished"></translation>
+        <translation>Reiniciar o instrumento?</translation>
     </message>
     <message>
         <source>Are you sure you want to reboot the instrument?</source>
-        <translation type="unfinished"></translation>
+        <translation>Tem certeza de que deseja reiniciar o instrumento?</translation>
     </message>
     <message>
         <source>Yes</source>
-        <translation type="unfinished"></translation>
+        <translation>Sim</translation>
     </message>
     <message>
         <source>No</source>
-        <translation type="unfinished">Não</translation>
+        <translation>Não</translation>
     </message>
 </context>
 <context>
@@ -1166,148 +1169,149 @@ Options</source>
     <message>
         <source>System &amp;
 Diagnostics</source>
-        <translation type="unfinished"></translation>
+        <translation>Sistema e
+diagnóstico</translation>
     </message>
     <message>
         <source>System Information</source>
-        <translation type="unfinished"></translation>
+        <translation>Informações do sistema</translation>
     </message>
     <message>
         <source>Database / Memory</source>
-        <translation type="unfinished"></translation>
+        <translation>Banco de dados / memória</translation>
     </message>
     <message>
         <source>Legal Information</source>
-        <translation type="unfinished"></translation>
+        <translation>Informações legais</translation>
     </message>
     <message>
         <source>Self Test</source>
-        <translation type="unfinished"></translation>
+        <translation>Autoteste</translation>
     </message>
 </context>
 <context>
     <name>SettingsSystemInformationPage</name>
     <message>
         <source>System Information</source>
-        <translation type="unfinished"></translation>
+        <translation>Informações do sistema</translation>
     </message>
     <message>
         <source>Not Configured</source>
-        <translation type="unfinished"></translation>
+        <translation>Não configurado</translation>
     </message>
     <message>
         <source>Instrument Model:</source>
-        <translation type="unfinished"></translation>
+        <translation>Modelo:</translation>
     </message>
     <message>
         <source>Instrument Serial:</source>
-        <translation type="unfinished"></translation>
+        <translation>N.º de série:</translation>
     </message>
     <message>
         <source>Part Number:</source>
-        <translation type="unfinished"></translation>
+        <translation>Código da peça:</translation>
     </message>
     <message>
         <source>White Reference Tile:</source>
-        <translation type="unfinished"></translation>
+        <translation>Padrão branco:</translation>
     </message>
     <message>
         <source>Certification Date:</source>
-        <translation type="unfinished"></translation>
+        <translation>Data de certificação:</translation>
     </message>
     <message>
         <source>Firmware Revision:</source>
-        <translation type="unfinished"></translation>
+        <translation>Versão do firmware:</translation>
     </message>
     <message>
         <source>Interface Revision:</source>
-        <translation type="unfinished"></translation>
+        <translation>Versão da interface:</translation>
     </message>
     <message>
         <source>Kernel:</source>
-        <translation type="unfinished"></translation>
+        <translation>Kernel:</translation>
     </message>
     <message>
         <source>Bootloader:</source>
-        <translation type="unfinished"></translation>
+        <translation>Bootloader:</translation>
     </message>
     <message>
         <source>Server URL:</source>
-        <translation type="unfinished"></translation>
+        <translation>URL do servidor:</translation>
     </message>
     <message>
         <source>Restore Factory Settings</source>
-        <translation type="unfinished"></translation>
+        <translation>Restaurar configurações de fábrica</translation>
     </message>
     <message>
         <source>Open Source</source>
-        <translation type="unfinished"></translation>
+        <translation>Código aberto</translation>
     </message>
     <message>
         <source>Burn in BIRCH JuniperX/Juniper</source>
-        <translation type="unfinished"></translation>
+        <translation>Burn in BIRCH JuniperX/Juniper</translation>
     </message>
     <message>
         <source>Burn in ALDER Larch</source>
-        <translation type="unfinished"></translation>
+        <translation>Burn in ALDER Larch</translation>
     </message>
     <message>
         <source>Burn in Spruce / Sequoia</source>
-        <translation type="unfinished"></translation>
+        <translation>Burn in Spruce / Sequoia</translation>
     </message>
 </context>
 <context>
     <name>SettingsVolumePage</name>
     <message>
         <source>Beeper Volume</source>
-        <translation type="unfinished"></translation>
+        <translation>Volume do bipe</translation>
     </message>
 </context>
 <context>
     <name>SettingsWifiPage</name>
     <message>
         <source>Wi-Fi</source>
-        <translation type="unfinished"></translation>
+        <translation>Wi-Fi</translation>
     </message>
     <message>
         <source>On</source>
-        <translation type="unfinished"></translation>
+        <translation>Ligado</translation>
     </message>
     <message>
         <source>Off</source>
-        <translation type="unfinished"></translation>
+        <translation>Desligado</translation>
     </message>
     <message>
         <source>Static IP</source>
-        <translation type="unfinished"></translation>
+        <translation>IP estático</translation>
     </message>
     <message>
         <source>DHCP</source>
-        <translation type="unfinished"></translation>
+        <translation>DHCP</translation>
     </message>
     <message>
         <source>Known Networks</source>
-        <translation type="unfinished"></translation>
+        <translation>Redes conhecidas</translation>
     </message>
     <message>
         <source>Unknown Networks</source>
-        <translation type="unfinished"></translation>
+        <translation>Redes disponíveis</translation>
     </message>
     <message>
         <source>Connection Issue</source>
-        <translation type="unfinished"></translation>
+        <translation>Problema de conexão</translation>
     </message>
     <message>
         <source>Incorrect password</source>
-        <translation type="unfinished"></translation>
+        <translation>Senha incorreta</translation>
     </message>
     <message>
         <source>Network not in range</source>
-        <translation type="unfinished"></translation>
+        <translation>Rede fora de alcance</translation>
     </message>
     <message>
         <source>OK</source>
-        <translation type="unfinished">OK</translation>
+        <translation>OK</translation>
     </message>
 </context>
 <context>
@@ -1552,19 +1556,19 @@ Diagnostics</source>
     <name>TargetingScreen</name>
     <message>
         <source>Job</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Press button to measure.</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Targeting</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Averaged 0 of SMC 0:0</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Measure</source>
@@ -1572,15 +1576,15 @@ Diagnostics</source>
     </message>
     <message>
         <source>Terminate</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Online Mode</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Averaged %1 of SMC %2:%3</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>OK</source>
@@ -1588,27 +1592,27 @@ Diagnostics</source>
     </message>
     <message>
         <source>Exit Online Mode?</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Exiting online mode will stop targeting and return to the job list.</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Exit</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Stop Measuring?</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>All measured samples and this job will be permanently deleted.</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>All measured samples from this job will be permanently deleted.</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Warning</source>
@@ -1616,31 +1620,31 @@ Diagnostics</source>
     </message>
     <message>
         <source>Continue</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Temperature out of range.  Continue online mode until complete, or Exit online mode and return to the job list?</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Temperature out of range.  Continue job until complete, or delete job and all samples and return to the job list?</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Temperature out of range.  Continue job until complete, or delete all samples and return to the job list?</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Delete</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Override Pressure Sensors?</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Not all pressure sensors are active. Press the measure button again to start a measurement, otherwise press the cancel button to return to targeting mode.</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Cancel</source>
@@ -1648,35 +1652,35 @@ Diagnostics</source>
     </message>
     <message>
         <source>Information</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Not all pressure sensors are active. Please ensure all pressure sensors are active before measuring</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Continue Measuring?</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>To continue with measurements, press OK</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Job Time Elapsed</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
-        <source>The job wasn&apos;t completed within the allocated time</source>
-        <translation type="unfinished"></translation>
+        <source>The job wasn't completed within the allocated time</source>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>SMC force finished, all readings averaged for result.</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Maximum number of SMC measurements used for this job</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>Complete</source>
@@ -1684,15 +1688,15 @@ Diagnostics</source>
     </message>
     <message>
         <source>The job has completed.  Press OK to exit online mode</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>SMC force finished, all readings averaged for result.  Press OK to exit online mode</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
     <message>
         <source>SMC failed after maximum measurements %1, the final results are averaged.  Press OK to exit online mode</source>
-        <translation type="unfinished"></translation>
+        <translation type="unfinished" />
     </message>
 </context>
 <context>
@@ -1732,15 +1736,15 @@ Diagnostics</source>
     <name>WifiPasswordScreen</name>
     <message>
         <source>Password</source>
-        <translation type="unfinished"></translation>
+        <translation>Senha</translation>
     </message>
     <message>
         <source>ABC</source>
-        <translation type="unfinished"></translation>
+        <translation>ABC</translation>
     </message>
     <message>
         <source>@&amp;*</source>
-        <translation type="unfinished"></translation>
+        <translation>@&amp;*</translation>
     </message>
 </context>
 </TS>

@@ -5,6 +5,7 @@
 #include "Commands/SystemOutCommands.h"
 #include "GUIAPI/API_SignalMaster.h"
 #include "GUIAPI/DataManager.h"
+#include "Widgets/SettingsPage.h"
 
 #include <QDebug>
 #include <QEvent>
@@ -15,6 +16,7 @@ RestoreFactorySettingsPopup::RestoreFactorySettingsPopup(QWidget* parent)
     , ui(new Ui::RestoreFactorySettingsPopup)
 {
     ui->setupUi(this);
+    ui->BtnBack->setIcon(SettingsPage::backButtonIcon());
     setObjectName(QStringLiteral("RestoreFactorySettingsPopup"));
     ui->labelTitle->setAutoSize(true);
     connect(ui->confirmationCircleWidget, &ConfirmationCircleWidget::confirmed, this,

@@ -10,7 +10,7 @@ namespace Ui {
 class WifiPasswordScreen;
 }
 
-class KLabel;
+class KeyPadLabel;
 class QLabel;
 class QLineEdit;
 class XPushButton;
@@ -29,7 +29,7 @@ public:
     void setNetworkName(const QString& ssid);
     QLineEdit* getTextEditPointer() const;
     // The labels of a layer: 0 capitals, 1 lower case, 2 and 3 the special page.
-    QVector<KLabel*> layer(int index) const;
+    QVector<KeyPadLabel*> layer(int index) const;
     int layerInForce() const;
     bool isShowingCaps() const { return m_displayCap; }
     bool isShowingSpecial() const { return m_displaySpecial; }
@@ -61,15 +61,13 @@ protected:
 private:
     void createKeypad();
     void updateKeypad();
-    KLabel* keyAt(const QPoint& position) const;
     QWidget* createKeyPressedNotification(const QString& text);
-    XPushButton* functionKey(const QString& name, const QRect& box);
     void retranslate();
 
     Ui::WifiPasswordScreen* ui;
-    QVector<QVector<KLabel*>> m_keys;
+    QVector<QVector<KeyPadLabel*>> m_keys;
     QWidget* m_keyPopup = nullptr;
-    KLabel* m_currentKey = nullptr;
+    KeyPadLabel* m_currentKey = nullptr;
     XPushButton* BtnDelete = nullptr;
     XPushButton* BtnEnter = nullptr; // no multilingual entry for keys
     XPushButton* BtnSpace = nullptr;

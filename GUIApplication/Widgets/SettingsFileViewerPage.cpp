@@ -9,6 +9,7 @@
 #include <QImageReader>
 #include <QLabel>
 #include <QPlainTextEdit>
+#include <QRegularExpression>
 #include <QScrollArea>
 #include <QScrollBar>
 #include <QTextStream>
@@ -17,6 +18,26 @@ namespace {
 // Licence texts can be long; more than this is not read into the viewer.
 const qint64 kMaxTextBytes = 2 * 1024 * 1024;
 } // namespace
+
+QString SettingsFileViewerPage::reflow(const QString& text)
+{
+    // Licence files are broken at 70 to 80 columns for a terminal; on a
+    // screen of 320 pixels those breaks leave ragged half lines. Lines of a
+    // paragraph are joined and the view wraps them itself.
+    QStringList paragraphs;
+    const QStringList blocks = text.split(QRegularExpression(QStringLiteral("\\n[ \\t]*\\n")));
+    for (const QString& block : blocks) {
+        QStringList lines;
+        for (const QString& line : block.split('\n')) {
+            const QString trimmed = line.trimmed();
+            if (!trimmed.isEmpty())
+                lines << trimmed;
+        }
+        if (!lines.isEmpty())
+            paragraphs << lines.join(QLatin1Char(' '));
+    }
+    return paragraphs.join(QStringLiteral("\n\n"));
+}
 
 bool SettingsFileViewerPage::isPictureFile(const QString& path)
 {
@@ -77,7 +98,7 @@ SettingsFileViewerPage::SettingsFileViewerPage(const QString& path, const QStrin
         } else {
             content = tr("The file can't be read.");
         }
-        m_text->setPlainText(content);
+        m_text->setPlainText(reflow(content));
         m_scroller->enableKineticScrollFor(m_text);
     }
 }

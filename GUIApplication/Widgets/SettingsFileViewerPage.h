@@ -19,6 +19,8 @@ public:
     QString text() const;
 
     static bool isPictureFile(const QString& path);
+    // Joins the lines of each paragraph; paragraphs stay apart.
+    static QString reflow(const QString& text);
 
 protected:
     void resizeEvent(QResizeEvent* event) override;

@@ -21,6 +21,8 @@ KLabel* rowLabel(QWidget* parent, const QRect& box, int pointSize, bool bold, co
     label->setStyleSheet(QStringLiteral("color: %1; background: transparent;").arg(Theme::css(colour)));
     label->setGeometry(box);
     label->setFont(Theme::font(pointSize, bold));
+    // A long translation goes onto a second line before it shrinks.
+    label->setWordWrap(true);
     label->setAutoSize(true);
     label->setAlignment(alignment);
     label->setAttribute(Qt::WA_TransparentForMouseEvents);
@@ -72,6 +74,8 @@ SettingsListSelectionItem::SettingsListSelectionItem(QWidget* parent)
                               Theme::TextBody);
     m_labelStatus = rowLabel(this, QRect(190, 0, 100, SettingsRows::RowHeight), Theme::FontBody, false,
                              Theme::TextSecondary, Qt::AlignRight | Qt::AlignVCenter);
+    // A value (an address, a name) reads best on one line, smaller if need be.
+    m_labelStatus->setWordWrap(false);
     m_labelArrow = rowPicture(this, QRect(292, 19, 16, 24));
     m_labelArrow->setPixmap(SettingsRows::arrowPixmap());
     layoutLabels();
@@ -147,9 +151,11 @@ void SettingsListSelectionItem::layoutLabels()
     const int right = m_labelArrow->isVisibleTo(this) ? 288 : 306;
     const int h = height();
     const QString status = m_labelStatus->defaultText();
+    const int settingWidth = QFontMetrics(m_labelSetting->defaultFont()).horizontalAdvance(m_labelSetting->defaultText()) + 16;
     int statusWidth = 0;
     if (!status.isEmpty())
-        statusWidth = qMin(QFontMetrics(m_labelStatus->defaultFont()).horizontalAdvance(status) + 4, 130);
+        statusWidth = qMin(QFontMetrics(m_labelStatus->defaultFont()).horizontalAdvance(status) + 14,
+                           qMax(100, right - left - settingWidth));
     m_labelStatus->setGeometry(right - statusWidth, 0, statusWidth, h);
     m_labelStatus->setVisible(statusWidth > 0);
     m_labelSetting->setGeometry(left, 0, qMax(40, right - statusWidth - left - 6), h);

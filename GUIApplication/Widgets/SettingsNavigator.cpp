@@ -52,6 +52,14 @@ bool SettingsNavigator::isAnimating() const
         || m_propertyAnimationOut.state() == QAbstractAnimation::Running;
 }
 
+void SettingsNavigator::finishTransitions()
+{
+    for (QPropertyAnimation* animation : {&m_propertyAnimationOut, &m_propertyAnimationIn}) {
+        if (animation->state() == QAbstractAnimation::Running)
+            animation->setCurrentTime(animation->totalDuration());
+    }
+}
+
 void SettingsNavigator::setFirstPage(SettingsPage* page)
 {
     createNextPage(page);

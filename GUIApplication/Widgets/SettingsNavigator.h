@@ -29,6 +29,8 @@ public:
     SettingsPage* topPage() const;
     SettingsPage* pageAt(int index) const;
     bool isAnimating() const;
+    // Brings a running slide to its end at once.
+    void finishTransitions();
 
 signals:
     void GotoScreen(SCREEN_ID_T id);

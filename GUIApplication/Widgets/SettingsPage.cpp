@@ -42,7 +42,13 @@ SettingsPage::~SettingsPage()
 void SettingsPage::construct(const QString& title, const QString& icon)
 {
     ui->setupUi(this);
+    ui->BtnBack->setIcon(backButtonIcon());
+    // Colour by palette: a style sheet would undo the font the label fits.
+    QPalette titlePalette = ui->labelSubHeader->palette();
+    titlePalette.setColor(QPalette::WindowText, QColor(241, 242, 242));
+    ui->labelSubHeader->setPalette(titlePalette);
     ui->labelSubHeader->setWordWrap(true);
+    m_titleFont = ui->labelSubHeader->defaultFont();
     ui->labelSubHeader->setAutoSize(true);
     ui->SettingsList->setShadowsEnabled(true);
     m_signalMapper = new QSignalMapper(this);
@@ -84,17 +90,26 @@ void SettingsPage::setIcon(const QString& icon)
     updateIconLocation();
 }
 
+QIcon SettingsPage::backButtonIcon(const QString& mark)
+{
+    QImage canvas(QStringLiteral(":/Assets/back_button.png"));
+    if (canvas.isNull())
+        return QIcon();
+    canvas = canvas.convertToFormat(QImage::Format_ARGB32);
+    QPainter painter(&canvas);
+    painter.setCompositionMode(QPainter::CompositionMode_Clear);
+    painter.fillRect(QRect(canvas.width() - 3, 0, 3, canvas.height()), Qt::transparent);
+    painter.setCompositionMode(QPainter::CompositionMode_SourceOver);
+    const QPixmap picture(mark);
+    if (!picture.isNull())
+        painter.drawPixmap(78, (canvas.height() - picture.height()) / 2, picture);
+    painter.end();
+    return QIcon(QPixmap::fromImage(canvas));
+}
+
 void SettingsPage::setBackIcon(const QString& icon)
 {
-    // The page's own mark stands right of the chevron, on the button.
-    QPixmap canvas(QStringLiteral(":/Assets/back_button.png"));
-    const QPixmap mark(icon);
-    if (!canvas.isNull() && !mark.isNull()) {
-        QPainter painter(&canvas);
-        const int x = 78;
-        painter.drawPixmap(x, (canvas.height() - mark.height()) / 2, mark);
-    }
-    ui->BtnBack->setIcon(QIcon(canvas));
+    ui->BtnBack->setIcon(backButtonIcon(icon));
 }
 
 void SettingsPage::setBackButtonVisible(bool visible)
@@ -137,9 +152,10 @@ void SettingsPage::updateIconLocation()
     const QFontMetrics metrics(ui->labelSubHeader->defaultFont());
     for (const QString& line : ui->labelSubHeader->defaultText().split('\n'))
         textWidth = qMax(textWidth, metrics.horizontalAdvance(line));
-    textWidth += 4;
+    textWidth += 10;
     if (!hasIcon) {
         ui->labelSubHeader->setGeometry(left, 0, 198, ui->labelSubHeader->height());
+        fitTitleFont(198);
         ui->labelSubHeader->setText(ui->labelSubHeader->defaultText());
         return;
     }
@@ -149,7 +165,26 @@ void SettingsPage::updateIconLocation()
     const int x = qBound(left, width() > 0 ? 160 - groupWidth / 2 : left, right - groupWidth);
     ui->labelIcon->move(x, ui->labelIcon->y());
     ui->labelSubHeader->setGeometry(x + iconWidth + kTitleIconGap, 0, textWidth, ui->labelSubHeader->height());
+    fitTitleFont(textWidth);
     ui->labelSubHeader->setText(ui->labelSubHeader->defaultText());
+}
+
+void SettingsPage::fitTitleFont(int boxWidth)
+{
+    // A single long word (a German compound) cannot wrap: it shrinks.
+    QFont font = m_titleFont;
+    const QStringList lines = ui->labelSubHeader->defaultText().split('\n');
+    auto widest = [&lines](const QFont& f) {
+        int w = 0;
+        for (const QString& line : lines) {
+            for (const QString& word : line.split(' '))
+                w = qMax(w, QFontMetrics(f).horizontalAdvance(word));
+        }
+        return w;
+    };
+    while (font.pointSize() > 9 && widest(font) > boxWidth - 6)
+        font.setPointSize(font.pointSize() - 1);
+    ui->labelSubHeader->setFont(font);
 }
 
 void SettingsPage::onGotoScreen(SCREEN_ID_T id)
@@ -183,8 +218,12 @@ void SettingsPage::clearList()
         QWidget* row = list->itemWidget(item);
         list->removeItemWidget(item);
         delete list->takeItem(0);
-        if (row)
+        if (row) {
+            // Deletion waits for the event loop, which a wait below this
+            // one does not run: out of sight at once.
+            row->hide();
             row->deleteLater();
+        }
     }
 }
 

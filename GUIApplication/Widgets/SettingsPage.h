@@ -34,6 +34,9 @@ public:
     FlickList* getSettingsList() const;
     void gotoNextPage(SettingsPage* page);
     QSignalMapper* signalMapper() const { return m_signalMapper; }
+    // The back button's picture without its divider (titles run under it),
+    // with an optional mark beside the chevron.
+    static QIcon backButtonIcon(const QString& mark = QString());
 
 signals:
     void GotoScreen(SCREEN_ID_T id);
@@ -62,6 +65,10 @@ protected:
 
 private:
     void construct(const QString& title, const QString& icon);
+    // The title's font as large as the bar allows for the present text.
+    void fitTitleFont(int boxWidth);
+
+    QFont m_titleFont;
 };
 
 #endif // SETTINGSPAGE_H

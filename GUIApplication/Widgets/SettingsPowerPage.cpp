@@ -6,6 +6,7 @@
 #include "Widgets/SettingsListItems.h"
 
 #include <QDebug>
+#include <QLabel>
 #include <QEvent>
 #include <QSignalMapper>
 
@@ -67,6 +68,9 @@ void SettingsPowerPage::onPowerOptionSelected(int option)
         emit closePopup(m_popup);
     m_popup = new DeletePopup(window());
     m_popup->setObjectName(QStringLiteral("PowerConfirmPopup"));
+    // A question about power, not about deleting: the warning mark.
+    if (auto* icon = m_popup->findChild<QLabel*>(QStringLiteral("labelIcon")))
+        icon->setPixmap(QPixmap(QStringLiteral(":/Assets/alert_popup_red_icon.png")));
     m_popup->setHeaderText(title);
     m_popup->setMessageText(text);
     m_popup->setConfirmButtonText(tr("Yes"));

@@ -59,10 +59,13 @@ void SettingsListSelectionSliderItem::build(bool compressed)
 
     labelSummaryText = new KLabel(this);
     labelSummaryText->setObjectName(QStringLiteral("labelSummaryText"));
-    labelSummaryText->setStyleSheet(QStringLiteral("color: %1; background: transparent;").arg(Theme::css(Theme::TextBody)));
+    QPalette summaryPalette = labelSummaryText->palette();
+    summaryPalette.setColor(QPalette::WindowText, Theme::TextBody);
+    labelSummaryText->setPalette(summaryPalette);
     labelSummaryText->setFont(Theme::font(compressed ? Theme::FontBody : Theme::FontHeadline));
+    labelSummaryText->setWordWrap(true);
     labelSummaryText->setAutoSize(true);
-    labelSummaryText->setGeometry(20, compressed ? 6 : 12, 214, compressed ? 30 : 34);
+    labelSummaryText->setGeometry(20, compressed ? 3 : 10, 218, compressed ? 36 : 38);
 
     labelEntryField = new QLabel(this);
     labelEntryField->setObjectName(QStringLiteral("labelEntryField"));

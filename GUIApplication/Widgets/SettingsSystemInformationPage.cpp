@@ -1,5 +1,6 @@
 #include "Widgets/SettingsSystemInformationPage.h"
 
+#include "AppShell.h"
 #include "Commands/SystemOutCommands.h"
 #include "GUIAPI/SystemAPI.h"
 #include "SharedSystem/Instrument.h"
@@ -12,6 +13,7 @@
 #include <QCoreApplication>
 #include <QDebug>
 #include <QEvent>
+#include <QFile>
 #include <QSignalMapper>
 
 SettingsSystemInformationPage::SettingsSystemInformationPage(QWidget* parent)
@@ -42,9 +44,13 @@ QList<QPair<QString, QString>> SettingsSystemInformationPage::readInformation()
         url = value.parameterString.trimmed();
     if (url.isEmpty())
         url = tr("Not Configured");
-    QString gui = QCoreApplication::applicationVersion();
+    // The program's own version, as its version file states it.
+    QString gui;
+    QFile versionFile(QCoreApplication::applicationDirPath() + QStringLiteral("/GUIVersion.txt"));
+    if (versionFile.open(QIODevice::ReadOnly))
+        gui = QString::fromUtf8(versionFile.readLine()).trimmed();
     if (gui.isEmpty())
-        gui = QStringLiteral(MARIGOLD_REVISION);
+        gui = AppShell::versionText(QStringLiteral(MARIGOLD_REVISION), QStringLiteral(__DATE__), QStringLiteral(__TIME__));
     return {
         {tr("Instrument Model:"), getStringFromList(Instrument_Get_Model_Type(), MODEL_TYPES_TABLE)},
         {tr("Instrument Serial:"), info.serialNum},

@@ -177,8 +177,12 @@ void SettingsWifiPage::clearList()
         QWidget* row = list->itemWidget(item);
         list->removeItemWidget(item);
         delete list->takeItem(list->count() - 1);
-        if (row)
+        if (row) {
+            // Deletion waits for the event loop, which a wait below this
+            // one does not run: out of sight at once.
+            row->hide();
             row->deleteLater();
+        }
     }
     clearSignalMapper();
 }
