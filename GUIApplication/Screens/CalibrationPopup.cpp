@@ -7,6 +7,7 @@
 #include "GUIAPI/MeasureAPI.h"
 #include "SharedSystem/Instrument.h"
 
+#include <QEvent>
 #include <QLabel>
 #include <QPointer>
 
@@ -186,6 +187,26 @@ void CalibrationPopup::onCountdownTimer()
     // Dropped: the trigger has not been given yet.
     setState(STATE_POPUP_MEASURING);
     triggerCalibration();
+}
+
+void CalibrationPopup::changeEvent(QEvent* event)
+{
+    // The form's own texts come back with a new language; the state's are
+    // put over them again.
+    MeasuringPopup::changeEvent(event);
+    if (event->type() != QEvent::LanguageChange)
+        return;
+    switch (m_state) {
+    case STATE_POPUP_INIT: ui->labelText->setText(startingText()); break;
+    case STATE_POPUP_MEASURING: ui->labelText->setText(measuringText()); break;
+    case STATE_POPUP_CALCULATING: ui->labelText->setText(tr("Calculating")); break;
+    case STATE_POPUP_COMPLETE:
+        ui->labelText->setText(tr("Complete"));
+        ui->labelSubText->setText(tr("OK to move instrument"));
+        break;
+    default: break;
+    }
+    ui->labelWarningSubText->setText(tr("Do not touch or bump instrument"));
 }
 
 bool CalibrationPopup::waitForIdle()

@@ -4,6 +4,8 @@
 
 #include "GUIAPI/API_SignalMaster.h"
 
+#include <QEvent>
+
 SelfTestPopup::SelfTestPopup(const QString& testName, SELF_TEST_TYPE type, QWidget* parent)
     : MeasuringPopup(parent)
     , m_testName(testName)
@@ -79,6 +81,16 @@ void SelfTestPopup::onUpdateSystemState(SYSTEM_STATE_T state)
         break;
     default:
         break;
+    }
+}
+
+void SelfTestPopup::changeEvent(QEvent* event)
+{
+    MeasuringPopup::changeEvent(event);
+    if (event->type() == QEvent::LanguageChange) {
+        const int percent = ui->progressBarCircle->value();
+        setState(m_state);
+        ui->progressBarCircle->setValue(percent);
     }
 }
 
