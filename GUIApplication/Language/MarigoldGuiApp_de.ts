@@ -2,6 +2,205 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="de_DE">
 <context>
+    <name>CalibrationNeededPopup</name>
+    <message>
+        <source>Calibration Required</source>
+        <translation>Kalibrierung erforderlich</translation>
+    </message>
+    <message>
+        <source>New measurements cannot be made until the instrument is calibrated. Press Calibrate to start the calibration sequence.</source>
+        <translation>Neue Messungen sind erst nach der Kalibrierung des Geräts möglich. Drücken Sie „Kalibrieren“, um die Kalibrierung zu starten.</translation>
+    </message>
+    <message>
+        <source>Ignore</source>
+        <translation>Ignorieren</translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation>Kalibrieren</translation>
+    </message>
+    <message>
+        <source>Calibration needed within %1 %2</source>
+        <translation>Kalibrierung fällig in %1 %2</translation>
+    </message>
+    <message>
+        <source>seconds</source>
+        <translation>Sekunden</translation>
+    </message>
+    <message>
+        <source>minutes</source>
+        <translation>Minuten</translation>
+    </message>
+    <message>
+        <source>hours</source>
+        <translation>Stunden</translation>
+    </message>
+    <message>
+        <source>days</source>
+        <translation>Tagen</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationPopup</name>
+    <message>
+        <source>Calibration Starting</source>
+        <translation>Kalibrierung beginnt</translation>
+    </message>
+    <message>
+        <source>Do not touch or bump instrument</source>
+        <translation>Gerät nicht berühren oder anstoßen</translation>
+    </message>
+    <message>
+        <source>Calibrating</source>
+        <translation>Kalibrierung läuft</translation>
+    </message>
+    <message>
+        <source>Calculating</source>
+        <translation>Berechnung läuft</translation>
+    </message>
+    <message>
+        <source>Complete</source>
+        <translation>Abgeschlossen</translation>
+    </message>
+    <message>
+        <source>OK to move instrument</source>
+        <translation>Gerät darf bewegt werden</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationReferenceCheckPopup</name>
+    <message>
+        <source>Measurement Starting</source>
+        <translation>Messung beginnt</translation>
+    </message>
+    <message>
+        <source>Measuring</source>
+        <translation>Messung läuft</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationSensorPopup</name>
+    <message>
+        <source>Not all pressure sensors are active. Press the OK button to start the calibration when all pressure sensors are active</source>
+        <translation>Nicht alle Drucksensoren sind aktiv. Drücken Sie OK, um die Kalibrierung zu starten, sobald alle Drucksensoren aktiv sind</translation>
+    </message>
+    <message>
+        <source>Incorrect Position</source>
+        <translation>Falsche Position</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Abbrechen</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationStep2PageContents</name>
+    <message>
+        <source>PLACE ON A FLAT SURFACE</source>
+        <translation>AUF EBENE FLÄCHE STELLEN</translation>
+    </message>
+    <message>
+        <source>ALIGN WHITE LINE</source>
+        <translation>WEISSE LINIE AUSRICHTEN</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationStep3PageContents</name>
+    <message>
+        <source>Tap the calibrate button to start calibration</source>
+        <translation>Tippen Sie auf „Kalibrieren“, um die Kalibrierung zu starten</translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation>Kalibrieren</translation>
+    </message>
+    <message>
+        <source>or</source>
+        <translation>oder</translation>
+    </message>
+    <message>
+        <source>Press the measurement button on the instrument</source>
+        <translation>Drücken Sie die Messtaste am Gerät</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationWizardPage</name>
+    <message>
+        <source>Step 1</source>
+        <translation>Schritt 1</translation>
+    </message>
+    <message>
+        <source>Step %1</source>
+        <translation>Schritt %1</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationWizardPageContainer</name>
+    <message>
+        <source>Tap the self test button to start self testing</source>
+        <translation>Tippen Sie auf „Selbsttest“, um den Selbsttest zu starten</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>Selbsttest</translation>
+    </message>
+    <message>
+        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
+        <translation>Kalibrieren Sie Ihr Gerät mit der mitgelieferten weißen Referenzkachel.</translation>
+    </message>
+    <message>
+        <source>Serial Number: %1</source>
+        <translation>Seriennummer: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
+        <translation>Setzen Sie das Gerät auf die weiße Kalibrierkachel und richten Sie die weiße Linie an der Markierung aus.</translation>
+    </message>
+    <message>
+        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Überprüfen Sie Ihr Gerät mit der mitgelieferten Effekt-Referenzkachel. Seriennummer: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
+        <translation>Setzen Sie das Gerät auf die Effekt-Referenzkachel und richten Sie die weiße Linie an der Markierung aus</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Führen Sie den Selbsttest mit der mitgelieferten weißen Referenzkachel durch. Seriennummer: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
+        <translation>Setzen Sie das Gerät auf die weiße Referenzkachel und richten Sie die weiße Linie an der Markierung aus</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Führen Sie den Selbsttest mit der mitgelieferten Effekt-Referenzkachel durch. Seriennummer: %1</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
+        <translation>Führen Sie den Selbsttest mit angehobenem Gerät durch (frei in der Luft, nirgends aufgesetzt)</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationWizardScreen</name>
+    <message>
+        <source>Calibration</source>
+        <translation>Kalibrierung</translation>
+    </message>
+    <message>
+        <source>Reference Tile Check</source>
+        <translation>Referenzkachel-Prüfung</translation>
+    </message>
+    <message>
+        <source>Self Test %1: %2</source>
+        <translation>Selbsttest %1: %2</translation>
+    </message>
+</context>
+<context>
     <name>DaddyPanel</name>
     <message>
         <source>Warning</source>
@@ -310,6 +509,91 @@
     <message>
         <source>OK</source>
         <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>SelfTestListItem</name>
+    <message>
+        <source>Pass</source>
+        <translation>Bestanden</translation>
+    </message>
+    <message>
+        <source>Fail</source>
+        <translation>Fehler</translation>
+    </message>
+    <message>
+        <source>Canceled</source>
+        <translation>Abgebrochen</translation>
+    </message>
+    <message>
+        <source>Error</source>
+        <translation>Störung</translation>
+    </message>
+</context>
+<context>
+    <name>SelfTestPopup</name>
+    <message>
+        <source>Hold the instrument in open air</source>
+        <translation>Gerät frei in der Luft halten</translation>
+    </message>
+    <message>
+        <source>Do not touch or bump instrument</source>
+        <translation>Gerät nicht berühren oder anstoßen</translation>
+    </message>
+    <message>
+        <source>Complete</source>
+        <translation>Abgeschlossen</translation>
+    </message>
+</context>
+<context>
+    <name>SelfTestScreen</name>
+    <message>
+        <source>Self Test</source>
+        <translation>Selbsttest</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+    <message>
+        <source>White Calibration</source>
+        <translation>Weißkalibrierung</translation>
+    </message>
+    <message>
+        <source>Reference check on white</source>
+        <translation>Referenzprüfung auf Weiß</translation>
+    </message>
+    <message>
+        <source>Effect tile test</source>
+        <translation>Effektkachel-Test</translation>
+    </message>
+    <message>
+        <source>Repeatability tests</source>
+        <translation>Wiederholbarkeitstests</translation>
+    </message>
+    <message>
+        <source>Temperature tests</source>
+        <translation>Temperaturtests</translation>
+    </message>
+    <message>
+        <source>Pressure sensor test</source>
+        <translation>Drucksensortest</translation>
+    </message>
+    <message>
+        <source>Check error logs</source>
+        <translation>Fehlerprotokolle prüfen</translation>
+    </message>
+    <message>
+        <source>Testing...</source>
+        <translation>Test läuft...</translation>
+    </message>
+    <message>
+        <source>All Tests Complete</source>
+        <translation>Alle Tests abgeschlossen</translation>
+    </message>
+    <message>
+        <source>Self Tests Canceled</source>
+        <translation>Selbsttests abgebrochen</translation>
     </message>
 </context>
 <context>

@@ -2,6 +2,205 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="en_US">
 <context>
+    <name>CalibrationNeededPopup</name>
+    <message>
+        <source>Calibration Required</source>
+        <translation>Calibration Required</translation>
+    </message>
+    <message>
+        <source>New measurements cannot be made until the instrument is calibrated. Press Calibrate to start the calibration sequence.</source>
+        <translation>New measurements cannot be made until the instrument is calibrated. Press Calibrate to start the calibration sequence.</translation>
+    </message>
+    <message>
+        <source>Ignore</source>
+        <translation>Ignore</translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation>Calibrate</translation>
+    </message>
+    <message>
+        <source>Calibration needed within %1 %2</source>
+        <translation>Calibration needed within %1 %2</translation>
+    </message>
+    <message>
+        <source>seconds</source>
+        <translation>seconds</translation>
+    </message>
+    <message>
+        <source>minutes</source>
+        <translation>minutes</translation>
+    </message>
+    <message>
+        <source>hours</source>
+        <translation>hours</translation>
+    </message>
+    <message>
+        <source>days</source>
+        <translation>days</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationPopup</name>
+    <message>
+        <source>Calibration Starting</source>
+        <translation>Calibration Starting</translation>
+    </message>
+    <message>
+        <source>Do not touch or bump instrument</source>
+        <translation>Do not touch or bump instrument</translation>
+    </message>
+    <message>
+        <source>Calibrating</source>
+        <translation>Calibrating</translation>
+    </message>
+    <message>
+        <source>Calculating</source>
+        <translation>Calculating</translation>
+    </message>
+    <message>
+        <source>Complete</source>
+        <translation>Complete</translation>
+    </message>
+    <message>
+        <source>OK to move instrument</source>
+        <translation>OK to move instrument</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationReferenceCheckPopup</name>
+    <message>
+        <source>Measurement Starting</source>
+        <translation>Measurement Starting</translation>
+    </message>
+    <message>
+        <source>Measuring</source>
+        <translation>Measuring</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationSensorPopup</name>
+    <message>
+        <source>Not all pressure sensors are active. Press the OK button to start the calibration when all pressure sensors are active</source>
+        <translation>Not all pressure sensors are active. Press the OK button to start the calibration when all pressure sensors are active</translation>
+    </message>
+    <message>
+        <source>Incorrect Position</source>
+        <translation>Incorrect Position</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Cancel</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationStep2PageContents</name>
+    <message>
+        <source>PLACE ON A FLAT SURFACE</source>
+        <translation>PLACE ON A FLAT SURFACE</translation>
+    </message>
+    <message>
+        <source>ALIGN WHITE LINE</source>
+        <translation>ALIGN WHITE LINE</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationStep3PageContents</name>
+    <message>
+        <source>Tap the calibrate button to start calibration</source>
+        <translation>Tap the calibrate button to start calibration</translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation>Calibrate</translation>
+    </message>
+    <message>
+        <source>or</source>
+        <translation>or</translation>
+    </message>
+    <message>
+        <source>Press the measurement button on the instrument</source>
+        <translation>Press the measurement button on the instrument</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationWizardPage</name>
+    <message>
+        <source>Step 1</source>
+        <translation>Step 1</translation>
+    </message>
+    <message>
+        <source>Step %1</source>
+        <translation>Step %1</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationWizardPageContainer</name>
+    <message>
+        <source>Tap the self test button to start self testing</source>
+        <translation>Tap the self test button to start self testing</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>Self Test</translation>
+    </message>
+    <message>
+        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
+        <translation>Calibrate your instrument by using the white reference tile included with your instrument.</translation>
+    </message>
+    <message>
+        <source>Serial Number: %1</source>
+        <translation>Serial Number: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
+        <translation>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</translation>
+    </message>
+    <message>
+        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
+        <translation>Place the instrument on the effect reference tile by aligning the white line on the desired reference</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
+        <translation>Place the instrument on the white reference tile by aligning the white line on the desired reference</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
+        <translation>Self test your instrument by lifting the instrument into open air (not placed on anything)</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationWizardScreen</name>
+    <message>
+        <source>Calibration</source>
+        <translation>Calibration</translation>
+    </message>
+    <message>
+        <source>Reference Tile Check</source>
+        <translation>Reference Tile Check</translation>
+    </message>
+    <message>
+        <source>Self Test %1: %2</source>
+        <translation>Self Test %1: %2</translation>
+    </message>
+</context>
+<context>
     <name>DaddyPanel</name>
     <message>
         <source>Warning</source>
@@ -310,6 +509,91 @@
     <message>
         <source>OK</source>
         <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>SelfTestListItem</name>
+    <message>
+        <source>Pass</source>
+        <translation>Pass</translation>
+    </message>
+    <message>
+        <source>Fail</source>
+        <translation>Fail</translation>
+    </message>
+    <message>
+        <source>Canceled</source>
+        <translation>Canceled</translation>
+    </message>
+    <message>
+        <source>Error</source>
+        <translation>Error</translation>
+    </message>
+</context>
+<context>
+    <name>SelfTestPopup</name>
+    <message>
+        <source>Hold the instrument in open air</source>
+        <translation>Hold the instrument in open air</translation>
+    </message>
+    <message>
+        <source>Do not touch or bump instrument</source>
+        <translation>Do not touch or bump instrument</translation>
+    </message>
+    <message>
+        <source>Complete</source>
+        <translation>Complete</translation>
+    </message>
+</context>
+<context>
+    <name>SelfTestScreen</name>
+    <message>
+        <source>Self Test</source>
+        <translation>Self Test</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+    <message>
+        <source>White Calibration</source>
+        <translation>White Calibration</translation>
+    </message>
+    <message>
+        <source>Reference check on white</source>
+        <translation>Reference check on white</translation>
+    </message>
+    <message>
+        <source>Effect tile test</source>
+        <translation>Effect tile test</translation>
+    </message>
+    <message>
+        <source>Repeatability tests</source>
+        <translation>Repeatability tests</translation>
+    </message>
+    <message>
+        <source>Temperature tests</source>
+        <translation>Temperature tests</translation>
+    </message>
+    <message>
+        <source>Pressure sensor test</source>
+        <translation>Pressure sensor test</translation>
+    </message>
+    <message>
+        <source>Check error logs</source>
+        <translation>Check error logs</translation>
+    </message>
+    <message>
+        <source>Testing...</source>
+        <translation>Testing...</translation>
+    </message>
+    <message>
+        <source>All Tests Complete</source>
+        <translation>All Tests Complete</translation>
+    </message>
+    <message>
+        <source>Self Tests Canceled</source>
+        <translation>Self Tests Canceled</translation>
     </message>
 </context>
 <context>

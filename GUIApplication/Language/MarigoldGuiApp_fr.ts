@@ -2,6 +2,205 @@
 <!DOCTYPE TS>
 <TS version="2.1" language="fr_FR">
 <context>
+    <name>CalibrationNeededPopup</name>
+    <message>
+        <source>Calibration Required</source>
+        <translation>Étalonnage requis</translation>
+    </message>
+    <message>
+        <source>New measurements cannot be made until the instrument is calibrated. Press Calibrate to start the calibration sequence.</source>
+        <translation>Aucune nouvelle mesure n&apos;est possible avant l&apos;étalonnage de l&apos;instrument. Appuyez sur Étalonner pour lancer l&apos;étalonnage.</translation>
+    </message>
+    <message>
+        <source>Ignore</source>
+        <translation>Ignorer</translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation>Étalonner</translation>
+    </message>
+    <message>
+        <source>Calibration needed within %1 %2</source>
+        <translation>Étalonnage requis dans %1 %2</translation>
+    </message>
+    <message>
+        <source>seconds</source>
+        <translation>secondes</translation>
+    </message>
+    <message>
+        <source>minutes</source>
+        <translation>minutes</translation>
+    </message>
+    <message>
+        <source>hours</source>
+        <translation>heures</translation>
+    </message>
+    <message>
+        <source>days</source>
+        <translation>jours</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationPopup</name>
+    <message>
+        <source>Calibration Starting</source>
+        <translation>Début de l&apos;étalonnage</translation>
+    </message>
+    <message>
+        <source>Do not touch or bump instrument</source>
+        <translation>Ne touchez pas et ne heurtez pas l&apos;instrument</translation>
+    </message>
+    <message>
+        <source>Calibrating</source>
+        <translation>Étalonnage en cours</translation>
+    </message>
+    <message>
+        <source>Calculating</source>
+        <translation>Calcul en cours</translation>
+    </message>
+    <message>
+        <source>Complete</source>
+        <translation>Terminé</translation>
+    </message>
+    <message>
+        <source>OK to move instrument</source>
+        <translation>Vous pouvez déplacer l&apos;instrument</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationReferenceCheckPopup</name>
+    <message>
+        <source>Measurement Starting</source>
+        <translation>Début de la mesure</translation>
+    </message>
+    <message>
+        <source>Measuring</source>
+        <translation>Mesure en cours</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationSensorPopup</name>
+    <message>
+        <source>Not all pressure sensors are active. Press the OK button to start the calibration when all pressure sensors are active</source>
+        <translation>Tous les capteurs de pression ne sont pas actifs. Appuyez sur OK pour lancer l&apos;étalonnage lorsque tous les capteurs sont actifs</translation>
+    </message>
+    <message>
+        <source>Incorrect Position</source>
+        <translation>Position incorrecte</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+    <message>
+        <source>Cancel</source>
+        <translation>Annuler</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationStep2PageContents</name>
+    <message>
+        <source>PLACE ON A FLAT SURFACE</source>
+        <translation>POSER SUR UNE SURFACE PLANE</translation>
+    </message>
+    <message>
+        <source>ALIGN WHITE LINE</source>
+        <translation>ALIGNER LA LIGNE BLANCHE</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationStep3PageContents</name>
+    <message>
+        <source>Tap the calibrate button to start calibration</source>
+        <translation>Touchez le bouton Étalonner pour lancer l&apos;étalonnage</translation>
+    </message>
+    <message>
+        <source>Calibrate</source>
+        <translation>Étalonner</translation>
+    </message>
+    <message>
+        <source>or</source>
+        <translation>ou</translation>
+    </message>
+    <message>
+        <source>Press the measurement button on the instrument</source>
+        <translation>Appuyez sur le bouton de mesure de l&apos;instrument</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationWizardPage</name>
+    <message>
+        <source>Step 1</source>
+        <translation>Étape 1</translation>
+    </message>
+    <message>
+        <source>Step %1</source>
+        <translation>Étape %1</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationWizardPageContainer</name>
+    <message>
+        <source>Tap the self test button to start self testing</source>
+        <translation>Touchez le bouton Autotest pour lancer l&apos;autotest</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>Autotest</translation>
+    </message>
+    <message>
+        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
+        <translation>Étalonnez votre instrument avec la plaque de référence blanche fournie.</translation>
+    </message>
+    <message>
+        <source>Serial Number: %1</source>
+        <translation>Numéro de série : %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
+        <translation>Posez l&apos;instrument sur la plaque d&apos;étalonnage blanche en alignant la ligne blanche sur le repère.</translation>
+    </message>
+    <message>
+        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Vérifiez votre instrument avec la plaque de référence à effet fournie. Numéro de série : %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
+        <translation>Posez l&apos;instrument sur la plaque de référence à effet en alignant la ligne blanche sur le repère</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Effectuez l&apos;autotest avec la plaque de référence blanche fournie. Numéro de série : %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
+        <translation>Posez l&apos;instrument sur la plaque de référence blanche en alignant la ligne blanche sur le repère</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Effectuez l&apos;autotest avec la plaque de référence à effet fournie. Numéro de série : %1</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
+        <translation>Effectuez l&apos;autotest en tenant l&apos;instrument en l&apos;air (posé sur rien)</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationWizardScreen</name>
+    <message>
+        <source>Calibration</source>
+        <translation>Étalonnage</translation>
+    </message>
+    <message>
+        <source>Reference Tile Check</source>
+        <translation>Contrôle de la plaque de référence</translation>
+    </message>
+    <message>
+        <source>Self Test %1: %2</source>
+        <translation>Autotest %1 : %2</translation>
+    </message>
+</context>
+<context>
     <name>DaddyPanel</name>
     <message>
         <source>Warning</source>
@@ -310,6 +509,91 @@
     <message>
         <source>OK</source>
         <translation>OK</translation>
+    </message>
+</context>
+<context>
+    <name>SelfTestListItem</name>
+    <message>
+        <source>Pass</source>
+        <translation>Réussi</translation>
+    </message>
+    <message>
+        <source>Fail</source>
+        <translation>Échec</translation>
+    </message>
+    <message>
+        <source>Canceled</source>
+        <translation>Annulé</translation>
+    </message>
+    <message>
+        <source>Error</source>
+        <translation>Erreur</translation>
+    </message>
+</context>
+<context>
+    <name>SelfTestPopup</name>
+    <message>
+        <source>Hold the instrument in open air</source>
+        <translation>Tenez l&apos;instrument en l&apos;air</translation>
+    </message>
+    <message>
+        <source>Do not touch or bump instrument</source>
+        <translation>Ne touchez pas et ne heurtez pas l&apos;instrument</translation>
+    </message>
+    <message>
+        <source>Complete</source>
+        <translation>Terminé</translation>
+    </message>
+</context>
+<context>
+    <name>SelfTestScreen</name>
+    <message>
+        <source>Self Test</source>
+        <translation>Autotest</translation>
+    </message>
+    <message>
+        <source>OK</source>
+        <translation>OK</translation>
+    </message>
+    <message>
+        <source>White Calibration</source>
+        <translation>Étalonnage du blanc</translation>
+    </message>
+    <message>
+        <source>Reference check on white</source>
+        <translation>Contrôle de référence sur blanc</translation>
+    </message>
+    <message>
+        <source>Effect tile test</source>
+        <translation>Test de la plaque à effet</translation>
+    </message>
+    <message>
+        <source>Repeatability tests</source>
+        <translation>Tests de répétabilité</translation>
+    </message>
+    <message>
+        <source>Temperature tests</source>
+        <translation>Tests de température</translation>
+    </message>
+    <message>
+        <source>Pressure sensor test</source>
+        <translation>Test des capteurs de pression</translation>
+    </message>
+    <message>
+        <source>Check error logs</source>
+        <translation>Vérifier les journaux d&apos;erreurs</translation>
+    </message>
+    <message>
+        <source>Testing...</source>
+        <translation>Test en cours...</translation>
+    </message>
+    <message>
+        <source>All Tests Complete</source>
+        <translation>Tous les tests sont terminés</translation>
+    </message>
+    <message>
+        <source>Self Tests Canceled</source>
+        <translation>Autotests annulés</translation>
     </message>
 </context>
 <context>

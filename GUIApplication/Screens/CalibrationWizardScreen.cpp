@@ -33,8 +33,6 @@ CalibrationWizardScreen::CalibrationWizardScreen(CALIBRATION_STATES state, QWidg
     ground.setColor(QPalette::Window, QColor(245, 245, 246));
     setPalette(ground);
     ui->TxtTitle->setAutoSize(true);
-    ui->BtnCalibrate->setAccessibleName(tr("Calibrate"));
-    ui->BtnBack->setAccessibleName(tr("Back"));
 
     API_SignalMaster* hub = API_SignalMaster::instance();
     connect(hub, &API_SignalMaster::CalibrationComplete, this, &CalibrationWizardScreen::onCalibrationComplete);
