@@ -211,10 +211,13 @@ void CalibrationPopup::changeEvent(QEvent* event)
 
 bool CalibrationPopup::waitForIdle()
 {
+    // A popup put away during the wait (its deletion may wait for this loop
+    // to end) must not start anything afterwards.
     QPointer<CalibrationPopup> self(this);
-    while (self && DataManager::instance()->getSystemStatus().getSystemState() != STATE_INIT)
+    while (self && !self->isHidden()
+           && DataManager::instance()->getSystemStatus().getSystemState() != STATE_INIT)
         Delay(kIdlePollMs);
-    return !self.isNull();
+    return self && !self->isHidden();
 }
 
 void CalibrationPopup::triggerCalibration()
