@@ -82,7 +82,7 @@
     <name>CalibrationSensorPopup</name>
     <message>
         <source>Not all pressure sensors are active. Press the OK button to start the calibration when all pressure sensors are active</source>
-        <translation>一部の圧力センサーが反応していません。すべての圧力センサーが反応したら OK を押して校正を開始してください</translation>
+        <translation>反応していない圧力センサーがあります。すべて反応したら OK で校正を開始してください</translation>
     </message>
     <message>
         <source>Incorrect Position</source>

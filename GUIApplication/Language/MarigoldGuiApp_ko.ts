@@ -82,7 +82,7 @@
     <name>CalibrationSensorPopup</name>
     <message>
         <source>Not all pressure sensors are active. Press the OK button to start the calibration when all pressure sensors are active</source>
-        <translation>일부 압력 센서가 활성화되지 않았습니다. 모든 압력 센서가 활성화되면 확인을 눌러 교정을 시작하십시오</translation>
+        <translation>일부 압력 센서가 비활성 상태입니다. 모두 활성화되면 확인을 눌러 교정을 시작하십시오</translation>
     </message>
     <message>
         <source>Incorrect Position</source>

@@ -41,6 +41,12 @@ CalibrationPopup::CalibrationPopup(QWidget* parent)
     m_pNumberLabel->setFont(big);
     m_pNumberLabel->setStyleSheet(QStringLiteral("color: rgb(45, 45, 45); background: transparent;"));
 
+    // Room for the longer translations of the texts under the ring.
+    ui->labelSubText->setGeometry(20, 312, 280, 60);
+    ui->labelWarningSubText->setGeometry(20, 374, 280, 64);
+    ui->labelSubText->setWordWrap(true);
+    ui->labelText->setWordWrap(true);
+
     m_countdownTimer.setObjectName(QStringLiteral("countdownTimer"));
     m_closeTimer.setSingleShot(true);
     connect(&m_countdownTimer, &QTimer::timeout, this, &CalibrationPopup::onCountdownTimer);

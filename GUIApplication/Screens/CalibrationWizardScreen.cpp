@@ -32,6 +32,8 @@ CalibrationWizardScreen::CalibrationWizardScreen(CALIBRATION_STATES state, QWidg
     QPalette ground = palette();
     ground.setColor(QPalette::Window, QColor(245, 245, 246));
     setPalette(ground);
+    // A long translated title takes two lines before it gets smaller.
+    ui->TxtTitle->setWordWrap(true);
     ui->TxtTitle->setAutoSize(true);
 
     API_SignalMaster* hub = API_SignalMaster::instance();

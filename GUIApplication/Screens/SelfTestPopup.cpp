@@ -12,6 +12,12 @@ SelfTestPopup::SelfTestPopup(const QString& testName, SELF_TEST_TYPE type, QWidg
     , m_testType(type)
 {
     setObjectName(QStringLiteral("SelfTestPopup"));
+    // A test's name can be long: two lines above the ring.
+    ui->labelText->setGeometry(20, 32, 280, 64);
+    ui->labelText->setWordWrap(true);
+    ui->labelSubText->setGeometry(20, 312, 280, 60);
+    ui->labelWarningSubText->setGeometry(20, 374, 280, 64);
+    ui->labelSubText->setWordWrap(true);
     connect(API_SignalMaster::instance(), &API_SignalMaster::SelfTestTestComplete, this,
             &SelfTestPopup::onSelfTestTestComplete);
     setState(STATE_POPUP_INIT);
