@@ -5,77 +5,77 @@
     <name>CalibrationNeededPopup</name>
     <message>
         <source>Calibration Required</source>
-        <translation type="unfinished" />
+        <translation>Kalibrierung erforderlich</translation>
     </message>
     <message>
         <source>New measurements cannot be made until the instrument is calibrated. Press Calibrate to start the calibration sequence.</source>
-        <translation type="unfinished" />
+        <translation>Neue Messungen sind erst nach der Kalibrierung des Geräts möglich. Drücken Sie „Kalibrieren“, um die Kalibrierung zu starten.</translation>
     </message>
     <message>
         <source>Ignore</source>
-        <translation type="unfinished" />
+        <translation>Ignorieren</translation>
     </message>
     <message>
         <source>Calibrate</source>
-        <translation type="unfinished" />
+        <translation>Kalibrieren</translation>
     </message>
     <message>
         <source>Calibration needed within %1 %2</source>
-        <translation type="unfinished" />
+        <translation>Kalibrierung fällig in %1 %2</translation>
     </message>
     <message>
         <source>seconds</source>
-        <translation type="unfinished" />
+        <translation>Sekunden</translation>
     </message>
     <message>
         <source>minutes</source>
-        <translation type="unfinished" />
+        <translation>Minuten</translation>
     </message>
     <message>
         <source>hours</source>
-        <translation type="unfinished" />
+        <translation>Stunden</translation>
     </message>
     <message>
         <source>days</source>
-        <translation type="unfinished" />
+        <translation>Tagen</translation>
     </message>
 </context>
 <context>
     <name>CalibrationPopup</name>
     <message>
         <source>Calibration Starting</source>
-        <translation type="unfinished" />
+        <translation>Kalibrierung beginnt</translation>
     </message>
     <message>
         <source>Calibrating</source>
-        <translation type="unfinished">Kalibrierung läuft</translation>
+        <translation>Kalibrierung läuft</translation>
     </message>
     <message>
         <source>Do not touch or bump instrument</source>
-        <translation type="unfinished">Gerät nicht berühren oder anstoßen</translation>
+        <translation>Gerät nicht berühren oder anstoßen</translation>
     </message>
     <message>
         <source>Calculating</source>
-        <translation type="unfinished">Berechnung läuft</translation>
+        <translation>Berechnung läuft</translation>
     </message>
     <message>
         <source>Complete</source>
-        <translation type="unfinished">Fertig</translation>
+        <translation>Abgeschlossen</translation>
     </message>
     <message>
         <source>OK to move instrument</source>
-        <translation type="unfinished">Gerät darf bewegt werden</translation>
+        <translation>Gerät darf bewegt werden</translation>
     </message>
 </context>
 <context>
     <name>CalibrationReferenceCheckPopup</name>
     <message>
         <source>Measurement Starting</source>
-        <translation type="unfinished" />
+        <translation>Messung beginnt</translation>
     </message>
     <message>
         <source>Measuring</source>
-        <translation type="unfinished">Messung läuft</translation>
+        <translation>Messung läuft</translation>
     </message>
 </context>
 <context>
@@ -122,49 +122,49 @@
     <name>CalibrationSensorPopup</name>
     <message>
         <source>Not all pressure sensors are active. Press the OK button to start the calibration when all pressure sensors are active</source>
-        <translation type="unfinished" />
+        <translation>Nicht alle Drucksensoren sind aktiv. Drücken Sie OK, um die Kalibrierung zu starten, sobald alle Drucksensoren aktiv sind</translation>
     </message>
     <message>
         <source>Incorrect Position</source>
-        <translation type="unfinished" />
+        <translation>Falsche Position</translation>
     </message>
     <message>
         <source>OK</source>
-        <translation type="unfinished">OK</translation>
+        <translation>OK</translation>
     </message>
     <message>
         <source>Cancel</source>
-        <translation type="unfinished">Abbrechen</translation>
+        <translation>Abbrechen</translation>
     </message>
 </context>
 <context>
     <name>CalibrationStep2PageContents</name>
     <message>
         <source>PLACE ON A FLAT SURFACE</source>
-        <translation type="unfinished" />
+        <translation>AUF EBENE FLÄCHE STELLEN</translation>
     </message>
     <message>
         <source>ALIGN WHITE LINE</source>
-        <translation type="unfinished" />
+        <translation>WEISSE LINIE AUSRICHTEN</translation>
     </message>
 </context>
 <context>
     <name>CalibrationStep3PageContents</name>
     <message>
         <source>Tap the calibrate button to start calibration</source>
-        <translation type="unfinished" />
+        <translation>Tippen Sie auf „Kalibrieren“, um die Kalibrierung zu starten</translation>
     </message>
     <message>
         <source>Calibrate</source>
-        <translation type="unfinished" />
+        <translation>Kalibrieren</translation>
     </message>
     <message>
         <source>or</source>
-        <translation type="unfinished" />
+        <translation>oder</translation>
     </message>
     <message>
         <source>Press the measurement button on the instrument</source>
-        <translation type="unfinished" />
+        <translation>Drücken Sie die Messtaste am Gerät</translation>
     </message>
 </context>
 <context>
@@ -186,18 +186,65 @@
     <name>CalibrationWizardPage</name>
     <message>
         <source>Step 1</source>
-        <translation type="unfinished" />
+        <translation>Schritt 1</translation>
     </message>
     <message>
         <source>Step %1</source>
-        <translation type="unfinished" />
+        <translation>Schritt %1</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationWizardPageContainer</name>
+    <message>
+        <source>Tap the self test button to start self testing</source>
+        <translation>Tippen Sie auf „Selbsttest“, um den Selbsttest zu starten</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>Selbsttest</translation>
+    </message>
+    <message>
+        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
+        <translation>Kalibrieren Sie Ihr Gerät mit der mitgelieferten weißen Referenzkachel.</translation>
+    </message>
+    <message>
+        <source>Serial Number: %1</source>
+        <translation>Seriennummer: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
+        <translation>Setzen Sie das Gerät auf die weiße Kalibrierkachel und richten Sie die weiße Linie an der Markierung aus.</translation>
+    </message>
+    <message>
+        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Überprüfen Sie Ihr Gerät mit der mitgelieferten Effekt-Referenzkachel. Seriennummer: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
+        <translation>Setzen Sie das Gerät auf die Effekt-Referenzkachel und richten Sie die weiße Linie an der Markierung aus</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Führen Sie den Selbsttest mit der mitgelieferten weißen Referenzkachel durch. Seriennummer: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
+        <translation>Setzen Sie das Gerät auf die weiße Referenzkachel und richten Sie die weiße Linie an der Markierung aus</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Führen Sie den Selbsttest mit der mitgelieferten Effekt-Referenzkachel durch. Seriennummer: %1</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
+        <translation>Führen Sie den Selbsttest mit angehobenem Gerät durch (frei in der Luft, nirgends aufgesetzt)</translation>
     </message>
 </context>
 <context>
     <name>CalibrationWizardScreen</name>
     <message>
         <source>Calibration</source>
-        <translation type="unfinished" />
+        <translation>Kalibrierung</translation>
     </message>
     <message>
         <source>Calibrate</source>
@@ -209,11 +256,11 @@
     </message>
     <message>
         <source>Self Test %1: %2</source>
-        <translation type="unfinished" />
+        <translation>Selbsttest %1: %2</translation>
     </message>
     <message>
         <source>Reference Tile Check</source>
-        <translation type="unfinished" />
+        <translation>Referenzkachel-Prüfung</translation>
     </message>
 </context>
 <context>
@@ -782,85 +829,85 @@
     <name>SelfTestListItem</name>
     <message>
         <source>Pass</source>
-        <translation type="unfinished" />
+        <translation>Bestanden</translation>
     </message>
     <message>
         <source>Fail</source>
-        <translation type="unfinished" />
+        <translation>Fehler</translation>
     </message>
     <message>
         <source>Canceled</source>
-        <translation type="unfinished" />
+        <translation>Abgebrochen</translation>
     </message>
     <message>
         <source>Error</source>
-        <translation type="unfinished">Fehler</translation>
+        <translation>Störung</translation>
     </message>
 </context>
 <context>
     <name>SelfTestPopup</name>
     <message>
         <source>Hold the instrument in open air</source>
-        <translation type="unfinished" />
+        <translation>Gerät frei in der Luft halten</translation>
     </message>
     <message>
         <source>Do not touch or bump instrument</source>
-        <translation type="unfinished">Gerät nicht berühren oder anstoßen</translation>
+        <translation>Gerät nicht berühren oder anstoßen</translation>
     </message>
     <message>
         <source>Complete</source>
-        <translation type="unfinished">Fertig</translation>
+        <translation>Abgeschlossen</translation>
     </message>
 </context>
 <context>
     <name>SelfTestScreen</name>
     <message>
         <source>Self Test</source>
-        <translation type="unfinished" />
+        <translation>Selbsttest</translation>
     </message>
     <message>
         <source>OK</source>
-        <translation type="unfinished">OK</translation>
+        <translation>OK</translation>
     </message>
     <message>
         <source>White Calibration</source>
-        <translation type="unfinished" />
+        <translation>Weißkalibrierung</translation>
     </message>
     <message>
         <source>Reference check on white</source>
-        <translation type="unfinished" />
+        <translation>Referenzprüfung auf Weiß</translation>
     </message>
     <message>
         <source>Effect tile test</source>
-        <translation type="unfinished" />
+        <translation>Effektkachel-Test</translation>
     </message>
     <message>
         <source>Repeatability tests</source>
-        <translation type="unfinished" />
+        <translation>Wiederholbarkeitstests</translation>
     </message>
     <message>
         <source>Temperature tests</source>
-        <translation type="unfinished" />
+        <translation>Temperaturtests</translation>
     </message>
     <message>
         <source>Pressure sensor test</source>
-        <translation type="unfinished" />
+        <translation>Drucksensortest</translation>
     </message>
     <message>
         <source>Check error logs</source>
-        <translation type="unfinished" />
+        <translation>Fehlerprotokolle prüfen</translation>
     </message>
     <message>
         <source>Testing...</source>
-        <translation type="unfinished" />
+        <translation>Test läuft...</translation>
     </message>
     <message>
         <source>All Tests Complete</source>
-        <translation type="unfinished" />
+        <translation>Alle Tests abgeschlossen</translation>
     </message>
     <message>
         <source>Self Tests Canceled</source>
-        <translation type="unfinished" />
+        <translation>Selbsttests abgebrochen</translation>
     </message>
 </context>
 <context>

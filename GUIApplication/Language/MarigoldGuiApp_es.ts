@@ -5,77 +5,77 @@
     <name>CalibrationNeededPopup</name>
     <message>
         <source>Calibration Required</source>
-        <translation type="unfinished" />
+        <translation>Calibración necesaria</translation>
     </message>
     <message>
         <source>New measurements cannot be made until the instrument is calibrated. Press Calibrate to start the calibration sequence.</source>
-        <translation type="unfinished" />
+        <translation>No se pueden realizar nuevas mediciones hasta que el instrumento esté calibrado. Pulse Calibrar para iniciar la calibración.</translation>
     </message>
     <message>
         <source>Ignore</source>
-        <translation type="unfinished" />
+        <translation>Ignorar</translation>
     </message>
     <message>
         <source>Calibrate</source>
-        <translation type="unfinished" />
+        <translation>Calibrar</translation>
     </message>
     <message>
         <source>Calibration needed within %1 %2</source>
-        <translation type="unfinished" />
+        <translation>Calibración necesaria en %1 %2</translation>
     </message>
     <message>
         <source>seconds</source>
-        <translation type="unfinished" />
+        <translation>segundos</translation>
     </message>
     <message>
         <source>minutes</source>
-        <translation type="unfinished" />
+        <translation>minutos</translation>
     </message>
     <message>
         <source>hours</source>
-        <translation type="unfinished" />
+        <translation>horas</translation>
     </message>
     <message>
         <source>days</source>
-        <translation type="unfinished" />
+        <translation>días</translation>
     </message>
 </context>
 <context>
     <name>CalibrationPopup</name>
     <message>
         <source>Calibration Starting</source>
-        <translation type="unfinished" />
+        <translation>Iniciando calibración</translation>
     </message>
     <message>
         <source>Calibrating</source>
-        <translation type="unfinished">Calibrando</translation>
+        <translation>Calibrando</translation>
     </message>
     <message>
         <source>Do not touch or bump instrument</source>
-        <translation type="unfinished">No toque ni golpee el instrumento</translation>
+        <translation>No toque ni golpee el instrumento</translation>
     </message>
     <message>
         <source>Calculating</source>
-        <translation type="unfinished">Calculando</translation>
+        <translation>Calculando</translation>
     </message>
     <message>
         <source>Complete</source>
-        <translation type="unfinished">Completados</translation>
+        <translation>Completado</translation>
     </message>
     <message>
         <source>OK to move instrument</source>
-        <translation type="unfinished">Ya puede mover el instrumento</translation>
+        <translation>Ya puede mover el instrumento</translation>
     </message>
 </context>
 <context>
     <name>CalibrationReferenceCheckPopup</name>
     <message>
         <source>Measurement Starting</source>
-        <translation type="unfinished" />
+        <translation>Iniciando medición</translation>
     </message>
     <message>
         <source>Measuring</source>
-        <translation type="unfinished">Midiendo</translation>
+        <translation>Midiendo</translation>
     </message>
 </context>
 <context>
@@ -122,49 +122,49 @@
     <name>CalibrationSensorPopup</name>
     <message>
         <source>Not all pressure sensors are active. Press the OK button to start the calibration when all pressure sensors are active</source>
-        <translation type="unfinished" />
+        <translation>No todos los sensores de presión están activos. Pulse OK para iniciar la calibración cuando todos los sensores estén activos</translation>
     </message>
     <message>
         <source>Incorrect Position</source>
-        <translation type="unfinished" />
+        <translation>Posición incorrecta</translation>
     </message>
     <message>
         <source>OK</source>
-        <translation type="unfinished">Aceptar</translation>
+        <translation>OK</translation>
     </message>
     <message>
         <source>Cancel</source>
-        <translation type="unfinished">Cancelar</translation>
+        <translation>Cancelar</translation>
     </message>
 </context>
 <context>
     <name>CalibrationStep2PageContents</name>
     <message>
         <source>PLACE ON A FLAT SURFACE</source>
-        <translation type="unfinished" />
+        <translation>COLOCAR SOBRE SUPERFICIE PLANA</translation>
     </message>
     <message>
         <source>ALIGN WHITE LINE</source>
-        <translation type="unfinished" />
+        <translation>ALINEAR LA LÍNEA BLANCA</translation>
     </message>
 </context>
 <context>
     <name>CalibrationStep3PageContents</name>
     <message>
         <source>Tap the calibrate button to start calibration</source>
-        <translation type="unfinished" />
+        <translation>Toque el botón Calibrar para iniciar la calibración</translation>
     </message>
     <message>
         <source>Calibrate</source>
-        <translation type="unfinished" />
+        <translation>Calibrar</translation>
     </message>
     <message>
         <source>or</source>
-        <translation type="unfinished" />
+        <translation>o</translation>
     </message>
     <message>
         <source>Press the measurement button on the instrument</source>
-        <translation type="unfinished" />
+        <translation>Pulse el botón de medición del instrumento</translation>
     </message>
 </context>
 <context>
@@ -186,18 +186,65 @@
     <name>CalibrationWizardPage</name>
     <message>
         <source>Step 1</source>
-        <translation type="unfinished" />
+        <translation>Paso 1</translation>
     </message>
     <message>
         <source>Step %1</source>
-        <translation type="unfinished" />
+        <translation>Paso %1</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationWizardPageContainer</name>
+    <message>
+        <source>Tap the self test button to start self testing</source>
+        <translation>Toque el botón Autoprueba para iniciarla</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>Autoprueba</translation>
+    </message>
+    <message>
+        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
+        <translation>Calibre el instrumento con la placa de referencia blanca incluida.</translation>
+    </message>
+    <message>
+        <source>Serial Number: %1</source>
+        <translation>Número de serie: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
+        <translation>Coloque el instrumento sobre la placa de calibración blanca alineando la línea blanca con la referencia.</translation>
+    </message>
+    <message>
+        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Verifique el instrumento con la placa de referencia de efecto incluida. Número de serie: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
+        <translation>Coloque el instrumento sobre la placa de referencia de efecto alineando la línea blanca con la referencia</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Realice la autoprueba con la placa de referencia blanca incluida. Número de serie: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
+        <translation>Coloque el instrumento sobre la placa de referencia blanca alineando la línea blanca con la referencia</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Realice la autoprueba con la placa de referencia de efecto incluida. Número de serie: %1</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
+        <translation>Realice la autoprueba con el instrumento levantado en el aire (sin apoyarlo en nada)</translation>
     </message>
 </context>
 <context>
     <name>CalibrationWizardScreen</name>
     <message>
         <source>Calibration</source>
-        <translation type="unfinished" />
+        <translation>Calibración</translation>
     </message>
     <message>
         <source>Calibrate</source>
@@ -209,11 +256,11 @@
     </message>
     <message>
         <source>Self Test %1: %2</source>
-        <translation type="unfinished" />
+        <translation>Autoprueba %1: %2</translation>
     </message>
     <message>
         <source>Reference Tile Check</source>
-        <translation type="unfinished" />
+        <translation>Verificación de placa de referencia</translation>
     </message>
 </context>
 <context>
@@ -782,85 +829,85 @@
     <name>SelfTestListItem</name>
     <message>
         <source>Pass</source>
-        <translation type="unfinished" />
+        <translation>Correcto</translation>
     </message>
     <message>
         <source>Fail</source>
-        <translation type="unfinished" />
+        <translation>Fallo</translation>
     </message>
     <message>
         <source>Canceled</source>
-        <translation type="unfinished" />
+        <translation>Cancelado</translation>
     </message>
     <message>
         <source>Error</source>
-        <translation type="unfinished">Error</translation>
+        <translation>Error</translation>
     </message>
 </context>
 <context>
     <name>SelfTestPopup</name>
     <message>
         <source>Hold the instrument in open air</source>
-        <translation type="unfinished" />
+        <translation>Mantenga el instrumento en el aire</translation>
     </message>
     <message>
         <source>Do not touch or bump instrument</source>
-        <translation type="unfinished">No toque ni golpee el instrumento</translation>
+        <translation>No toque ni golpee el instrumento</translation>
     </message>
     <message>
         <source>Complete</source>
-        <translation type="unfinished">Completados</translation>
+        <translation>Completado</translation>
     </message>
 </context>
 <context>
     <name>SelfTestScreen</name>
     <message>
         <source>Self Test</source>
-        <translation type="unfinished" />
+        <translation>Autoprueba</translation>
     </message>
     <message>
         <source>OK</source>
-        <translation type="unfinished">Aceptar</translation>
+        <translation>OK</translation>
     </message>
     <message>
         <source>White Calibration</source>
-        <translation type="unfinished" />
+        <translation>Calibración de blanco</translation>
     </message>
     <message>
         <source>Reference check on white</source>
-        <translation type="unfinished" />
+        <translation>Verificación de referencia en blanco</translation>
     </message>
     <message>
         <source>Effect tile test</source>
-        <translation type="unfinished" />
+        <translation>Prueba de placa de efecto</translation>
     </message>
     <message>
         <source>Repeatability tests</source>
-        <translation type="unfinished" />
+        <translation>Pruebas de repetibilidad</translation>
     </message>
     <message>
         <source>Temperature tests</source>
-        <translation type="unfinished" />
+        <translation>Pruebas de temperatura</translation>
     </message>
     <message>
         <source>Pressure sensor test</source>
-        <translation type="unfinished" />
+        <translation>Prueba de sensores de presión</translation>
     </message>
     <message>
         <source>Check error logs</source>
-        <translation type="unfinished" />
+        <translation>Comprobar registros de errores</translation>
     </message>
     <message>
         <source>Testing...</source>
-        <translation type="unfinished" />
+        <translation>Probando...</translation>
     </message>
     <message>
         <source>All Tests Complete</source>
-        <translation type="unfinished" />
+        <translation>Todas las pruebas completadas</translation>
     </message>
     <message>
         <source>Self Tests Canceled</source>
-        <translation type="unfinished" />
+        <translation>Autopruebas canceladas</translation>
     </message>
 </context>
 <context>

@@ -5,77 +5,77 @@
     <name>CalibrationNeededPopup</name>
     <message>
         <source>Calibration Required</source>
-        <translation type="unfinished" />
+        <translation>Étalonnage requis</translation>
     </message>
     <message>
         <source>New measurements cannot be made until the instrument is calibrated. Press Calibrate to start the calibration sequence.</source>
-        <translation type="unfinished" />
+        <translation>Aucune nouvelle mesure n'est possible avant l'étalonnage de l'instrument. Appuyez sur Étalonner pour lancer l'étalonnage.</translation>
     </message>
     <message>
         <source>Ignore</source>
-        <translation type="unfinished" />
+        <translation>Ignorer</translation>
     </message>
     <message>
         <source>Calibrate</source>
-        <translation type="unfinished" />
+        <translation>Étalonner</translation>
     </message>
     <message>
         <source>Calibration needed within %1 %2</source>
-        <translation type="unfinished" />
+        <translation>Étalonnage requis dans %1 %2</translation>
     </message>
     <message>
         <source>seconds</source>
-        <translation type="unfinished" />
+        <translation>secondes</translation>
     </message>
     <message>
         <source>minutes</source>
-        <translation type="unfinished" />
+        <translation>minutes</translation>
     </message>
     <message>
         <source>hours</source>
-        <translation type="unfinished" />
+        <translation>heures</translation>
     </message>
     <message>
         <source>days</source>
-        <translation type="unfinished" />
+        <translation>jours</translation>
     </message>
 </context>
 <context>
     <name>CalibrationPopup</name>
     <message>
         <source>Calibration Starting</source>
-        <translation type="unfinished" />
+        <translation>Début de l'étalonnage</translation>
     </message>
     <message>
         <source>Calibrating</source>
-        <translation type="unfinished">Étalonnage en cours</translation>
+        <translation>Étalonnage en cours</translation>
     </message>
     <message>
         <source>Do not touch or bump instrument</source>
-        <translation type="unfinished">Ne touchez pas et ne heurtez pas l'instrument</translation>
+        <translation>Ne touchez pas et ne heurtez pas l'instrument</translation>
     </message>
     <message>
         <source>Calculating</source>
-        <translation type="unfinished">Calcul en cours</translation>
+        <translation>Calcul en cours</translation>
     </message>
     <message>
         <source>Complete</source>
-        <translation type="unfinished">Terminés</translation>
+        <translation>Terminé</translation>
     </message>
     <message>
         <source>OK to move instrument</source>
-        <translation type="unfinished">Vous pouvez déplacer l'instrument</translation>
+        <translation>Vous pouvez déplacer l'instrument</translation>
     </message>
 </context>
 <context>
     <name>CalibrationReferenceCheckPopup</name>
     <message>
         <source>Measurement Starting</source>
-        <translation type="unfinished" />
+        <translation>Début de la mesure</translation>
     </message>
     <message>
         <source>Measuring</source>
-        <translation type="unfinished">Mesure en cours</translation>
+        <translation>Mesure en cours</translation>
     </message>
 </context>
 <context>
@@ -122,49 +122,49 @@
     <name>CalibrationSensorPopup</name>
     <message>
         <source>Not all pressure sensors are active. Press the OK button to start the calibration when all pressure sensors are active</source>
-        <translation type="unfinished" />
+        <translation>Tous les capteurs de pression ne sont pas actifs. Appuyez sur OK pour lancer l'étalonnage lorsque tous les capteurs sont actifs</translation>
     </message>
     <message>
         <source>Incorrect Position</source>
-        <translation type="unfinished" />
+        <translation>Position incorrecte</translation>
     </message>
     <message>
         <source>OK</source>
-        <translation type="unfinished">OK</translation>
+        <translation>OK</translation>
     </message>
     <message>
         <source>Cancel</source>
-        <translation type="unfinished">Annuler</translation>
+        <translation>Annuler</translation>
     </message>
 </context>
 <context>
     <name>CalibrationStep2PageContents</name>
     <message>
         <source>PLACE ON A FLAT SURFACE</source>
-        <translation type="unfinished" />
+        <translation>POSER SUR UNE SURFACE PLANE</translation>
     </message>
     <message>
         <source>ALIGN WHITE LINE</source>
-        <translation type="unfinished" />
+        <translation>ALIGNER LA LIGNE BLANCHE</translation>
     </message>
 </context>
 <context>
     <name>CalibrationStep3PageContents</name>
     <message>
         <source>Tap the calibrate button to start calibration</source>
-        <translation type="unfinished" />
+        <translation>Touchez le bouton Étalonner pour lancer l'étalonnage</translation>
     </message>
     <message>
         <source>Calibrate</source>
-        <translation type="unfinished" />
+        <translation>Étalonner</translation>
     </message>
     <message>
         <source>or</source>
-        <translation type="unfinished" />
+        <translation>ou</translation>
     </message>
     <message>
         <source>Press the measurement button on the instrument</source>
-        <translation type="unfinished" />
+        <translation>Appuyez sur le bouton de mesure de l'instrument</translation>
     </message>
 </context>
 <context>
@@ -186,18 +186,65 @@
     <name>CalibrationWizardPage</name>
     <message>
         <source>Step 1</source>
-        <translation type="unfinished" />
+        <translation>Étape 1</translation>
     </message>
     <message>
         <source>Step %1</source>
-        <translation type="unfinished" />
+        <translation>Étape %1</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationWizardPageContainer</name>
+    <message>
+        <source>Tap the self test button to start self testing</source>
+        <translation>Touchez le bouton Autotest pour lancer l'autotest</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>Autotest</translation>
+    </message>
+    <message>
+        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
+        <translation>Étalonnez votre instrument avec la plaque de référence blanche fournie.</translation>
+    </message>
+    <message>
+        <source>Serial Number: %1</source>
+        <translation>Numéro de série : %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
+        <translation>Posez l'instrument sur la plaque d'étalonnage blanche en alignant la ligne blanche sur le repère.</translation>
+    </message>
+    <message>
+        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Vérifiez votre instrument avec la plaque de référence à effet fournie. Numéro de série : %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
+        <translation>Posez l'instrument sur la plaque de référence à effet en alignant la ligne blanche sur le repère</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Effectuez l'autotest avec la plaque de référence blanche fournie. Numéro de série : %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
+        <translation>Posez l'instrument sur la plaque de référence blanche en alignant la ligne blanche sur le repère</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Effectuez l'autotest avec la plaque de référence à effet fournie. Numéro de série : %1</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
+        <translation>Effectuez l'autotest en tenant l'instrument en l'air (posé sur rien)</translation>
     </message>
 </context>
 <context>
     <name>CalibrationWizardScreen</name>
     <message>
         <source>Calibration</source>
-        <translation type="unfinished" />
+        <translation>Étalonnage</translation>
     </message>
     <message>
         <source>Calibrate</source>
@@ -209,11 +256,11 @@
     </message>
     <message>
         <source>Self Test %1: %2</source>
-        <translation type="unfinished" />
+        <translation>Autotest %1 : %2</translation>
     </message>
     <message>
         <source>Reference Tile Check</source>
-        <translation type="unfinished" />
+        <translation>Contrôle de la plaque de référence</translation>
     </message>
 </context>
 <context>
@@ -782,85 +829,85 @@
     <name>SelfTestListItem</name>
     <message>
         <source>Pass</source>
-        <translation type="unfinished" />
+        <translation>Réussi</translation>
     </message>
     <message>
         <source>Fail</source>
-        <translation type="unfinished" />
+        <translation>Échec</translation>
     </message>
     <message>
         <source>Canceled</source>
-        <translation type="unfinished" />
+        <translation>Annulé</translation>
     </message>
     <message>
         <source>Error</source>
-        <translation type="unfinished">Erreur</translation>
+        <translation>Erreur</translation>
     </message>
 </context>
 <context>
     <name>SelfTestPopup</name>
     <message>
         <source>Hold the instrument in open air</source>
-        <translation type="unfinished" />
+        <translation>Tenez l'instrument en l'air</translation>
     </message>
     <message>
         <source>Do not touch or bump instrument</source>
-        <translation type="unfinished">Ne touchez pas et ne heurtez pas l'instrument</translation>
+        <translation>Ne touchez pas et ne heurtez pas l'instrument</translation>
     </message>
     <message>
         <source>Complete</source>
-        <translation type="unfinished">Terminés</translation>
+        <translation>Terminé</translation>
     </message>
 </context>
 <context>
     <name>SelfTestScreen</name>
     <message>
         <source>Self Test</source>
-        <translation type="unfinished" />
+        <translation>Autotest</translation>
     </message>
     <message>
         <source>OK</source>
-        <translation type="unfinished">OK</translation>
+        <translation>OK</translation>
     </message>
     <message>
         <source>White Calibration</source>
-        <translation type="unfinished" />
+        <translation>Étalonnage du blanc</translation>
     </message>
     <message>
         <source>Reference check on white</source>
-        <translation type="unfinished" />
+        <translation>Contrôle de référence sur blanc</translation>
     </message>
     <message>
         <source>Effect tile test</source>
-        <translation type="unfinished" />
+        <translation>Test de la plaque à effet</translation>
     </message>
     <message>
         <source>Repeatability tests</source>
-        <translation type="unfinished" />
+        <translation>Tests de répétabilité</translation>
     </message>
     <message>
         <source>Temperature tests</source>
-        <translation type="unfinished" />
+        <translation>Tests de température</translation>
     </message>
     <message>
         <source>Pressure sensor test</source>
-        <translation type="unfinished" />
+        <translation>Test des capteurs de pression</translation>
     </message>
     <message>
         <source>Check error logs</source>
-        <translation type="unfinished" />
+        <translation>Vérifier les journaux d'erreurs</translation>
     </message>
     <message>
         <source>Testing...</source>
-        <translation type="unfinished" />
+        <translation>Test en cours...</translation>
     </message>
     <message>
         <source>All Tests Complete</source>
-        <translation type="unfinished" />
+        <translation>Tous les tests sont terminés</translation>
     </message>
     <message>
         <source>Self Tests Canceled</source>
-        <translation type="unfinished" />
+        <translation>Autotests annulés</translation>
     </message>
 </context>
 <context>

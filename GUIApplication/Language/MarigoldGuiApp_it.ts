@@ -5,77 +5,77 @@
     <name>CalibrationNeededPopup</name>
     <message>
         <source>Calibration Required</source>
-        <translation type="unfinished" />
+        <translation>Calibrazione necessaria</translation>
     </message>
     <message>
         <source>New measurements cannot be made until the instrument is calibrated. Press Calibrate to start the calibration sequence.</source>
-        <translation type="unfinished" />
+        <translation>Non è possibile eseguire nuove misurazioni finché lo strumento non è calibrato. Premere Calibra per avviare la calibrazione.</translation>
     </message>
     <message>
         <source>Ignore</source>
-        <translation type="unfinished" />
+        <translation>Ignora</translation>
     </message>
     <message>
         <source>Calibrate</source>
-        <translation type="unfinished" />
+        <translation>Calibra</translation>
     </message>
     <message>
         <source>Calibration needed within %1 %2</source>
-        <translation type="unfinished" />
+        <translation>Calibrazione necessaria entro %1 %2</translation>
     </message>
     <message>
         <source>seconds</source>
-        <translation type="unfinished" />
+        <translation>secondi</translation>
     </message>
     <message>
         <source>minutes</source>
-        <translation type="unfinished" />
+        <translation>minuti</translation>
     </message>
     <message>
         <source>hours</source>
-        <translation type="unfinished" />
+        <translation>ore</translation>
     </message>
     <message>
         <source>days</source>
-        <translation type="unfinished" />
+        <translation>giorni</translation>
     </message>
 </context>
 <context>
     <name>CalibrationPopup</name>
     <message>
         <source>Calibration Starting</source>
-        <translation type="unfinished" />
+        <translation>Avvio calibrazione</translation>
     </message>
     <message>
         <source>Calibrating</source>
-        <translation type="unfinished">Calibrazione in corso</translation>
+        <translation>Calibrazione in corso</translation>
     </message>
     <message>
         <source>Do not touch or bump instrument</source>
-        <translation type="unfinished">Non toccare né urtare lo strumento</translation>
+        <translation>Non toccare né urtare lo strumento</translation>
     </message>
     <message>
         <source>Calculating</source>
-        <translation type="unfinished">Calcolo in corso</translation>
+        <translation>Calcolo in corso</translation>
     </message>
     <message>
         <source>Complete</source>
-        <translation type="unfinished">Completati</translation>
+        <translation>Completato</translation>
     </message>
     <message>
         <source>OK to move instrument</source>
-        <translation type="unfinished">È possibile spostare lo strumento</translation>
+        <translation>È possibile spostare lo strumento</translation>
     </message>
 </context>
 <context>
     <name>CalibrationReferenceCheckPopup</name>
     <message>
         <source>Measurement Starting</source>
-        <translation type="unfinished" />
+        <translation>Avvio misurazione</translation>
     </message>
     <message>
         <source>Measuring</source>
-        <translation type="unfinished">Misurazione</translation>
+        <translation>Misurazione</translation>
     </message>
 </context>
 <context>
@@ -122,49 +122,49 @@
     <name>CalibrationSensorPopup</name>
     <message>
         <source>Not all pressure sensors are active. Press the OK button to start the calibration when all pressure sensors are active</source>
-        <translation type="unfinished" />
+        <translation>Non tutti i sensori di pressione sono attivi. Premere OK per avviare la calibrazione quando tutti i sensori sono attivi</translation>
     </message>
     <message>
         <source>Incorrect Position</source>
-        <translation type="unfinished" />
+        <translation>Posizione errata</translation>
     </message>
     <message>
         <source>OK</source>
-        <translation type="unfinished">OK</translation>
+        <translation>OK</translation>
     </message>
     <message>
         <source>Cancel</source>
-        <translation type="unfinished">Annulla</translation>
+        <translation>Annulla</translation>
     </message>
 </context>
 <context>
     <name>CalibrationStep2PageContents</name>
     <message>
         <source>PLACE ON A FLAT SURFACE</source>
-        <translation type="unfinished" />
+        <translation>APPOGGIARE SU SUPERFICIE PIANA</translation>
     </message>
     <message>
         <source>ALIGN WHITE LINE</source>
-        <translation type="unfinished" />
+        <translation>ALLINEARE LA LINEA BIANCA</translation>
     </message>
 </context>
 <context>
     <name>CalibrationStep3PageContents</name>
     <message>
         <source>Tap the calibrate button to start calibration</source>
-        <translation type="unfinished" />
+        <translation>Toccare il pulsante Calibra per avviare la calibrazione</translation>
     </message>
     <message>
         <source>Calibrate</source>
-        <translation type="unfinished" />
+        <translation>Calibra</translation>
     </message>
     <message>
         <source>or</source>
-        <translation type="unfinished" />
+        <translation>oppure</translation>
     </message>
     <message>
         <source>Press the measurement button on the instrument</source>
-        <translation type="unfinished" />
+        <translation>Premere il pulsante di misurazione sullo strumento</translation>
     </message>
 </context>
 <context>
@@ -186,18 +186,65 @@
     <name>CalibrationWizardPage</name>
     <message>
         <source>Step 1</source>
-        <translation type="unfinished" />
+        <translation>Passo 1</translation>
     </message>
     <message>
         <source>Step %1</source>
-        <translation type="unfinished" />
+        <translation>Passo %1</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationWizardPageContainer</name>
+    <message>
+        <source>Tap the self test button to start self testing</source>
+        <translation>Toccare il pulsante Autotest per avviarlo</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>Autotest</translation>
+    </message>
+    <message>
+        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
+        <translation>Calibrare lo strumento con la piastrella di riferimento bianca in dotazione.</translation>
+    </message>
+    <message>
+        <source>Serial Number: %1</source>
+        <translation>Numero di serie: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
+        <translation>Appoggiare lo strumento sulla piastrella di calibrazione bianca allineando la linea bianca al riferimento.</translation>
+    </message>
+    <message>
+        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Verificare lo strumento con la piastrella di riferimento a effetto in dotazione. Numero di serie: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
+        <translation>Appoggiare lo strumento sulla piastrella di riferimento a effetto allineando la linea bianca al riferimento</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Eseguire l'autotest con la piastrella di riferimento bianca in dotazione. Numero di serie: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
+        <translation>Appoggiare lo strumento sulla piastrella di riferimento bianca allineando la linea bianca al riferimento</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Eseguire l'autotest con la piastrella di riferimento a effetto in dotazione. Numero di serie: %1</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
+        <translation>Eseguire l'autotest tenendo lo strumento sollevato in aria (non appoggiato)</translation>
     </message>
 </context>
 <context>
     <name>CalibrationWizardScreen</name>
     <message>
         <source>Calibration</source>
-        <translation type="unfinished" />
+        <translation>Calibrazione</translation>
     </message>
     <message>
         <source>Calibrate</source>
@@ -209,11 +256,11 @@
     </message>
     <message>
         <source>Self Test %1: %2</source>
-        <translation type="unfinished" />
+        <translation>Autotest %1: %2</translation>
     </message>
     <message>
         <source>Reference Tile Check</source>
-        <translation type="unfinished" />
+        <translation>Verifica piastrella di riferimento</translation>
     </message>
 </context>
 <context>
@@ -782,85 +829,85 @@
     <name>SelfTestListItem</name>
     <message>
         <source>Pass</source>
-        <translation type="unfinished" />
+        <translation>Superato</translation>
     </message>
     <message>
         <source>Fail</source>
-        <translation type="unfinished" />
+        <translation>Non superato</translation>
     </message>
     <message>
         <source>Canceled</source>
-        <translation type="unfinished" />
+        <translation>Annullato</translation>
     </message>
     <message>
         <source>Error</source>
-        <translation type="unfinished">Errore</translation>
+        <translation>Errore</translation>
     </message>
 </context>
 <context>
     <name>SelfTestPopup</name>
     <message>
         <source>Hold the instrument in open air</source>
-        <translation type="unfinished" />
+        <translation>Tenere lo strumento sollevato in aria</translation>
     </message>
     <message>
         <source>Do not touch or bump instrument</source>
-        <translation type="unfinished">Non toccare né urtare lo strumento</translation>
+        <translation>Non toccare né urtare lo strumento</translation>
     </message>
     <message>
         <source>Complete</source>
-        <translation type="unfinished">Completati</translation>
+        <translation>Completato</translation>
     </message>
 </context>
 <context>
     <name>SelfTestScreen</name>
     <message>
         <source>Self Test</source>
-        <translation type="unfinished" />
+        <translation>Autotest</translation>
     </message>
     <message>
         <source>OK</source>
-        <translation type="unfinished">OK</translation>
+        <translation>OK</translation>
     </message>
     <message>
         <source>White Calibration</source>
-        <translation type="unfinished" />
+        <translation>Calibrazione del bianco</translation>
     </message>
     <message>
         <source>Reference check on white</source>
-        <translation type="unfinished" />
+        <translation>Verifica di riferimento sul bianco</translation>
     </message>
     <message>
         <source>Effect tile test</source>
-        <translation type="unfinished" />
+        <translation>Test piastrella a effetto</translation>
     </message>
     <message>
         <source>Repeatability tests</source>
-        <translation type="unfinished" />
+        <translation>Test di ripetibilità</translation>
     </message>
     <message>
         <source>Temperature tests</source>
-        <translation type="unfinished" />
+        <translation>Test di temperatura</translation>
     </message>
     <message>
         <source>Pressure sensor test</source>
-        <translation type="unfinished" />
+        <translation>Test sensori di pressione</translation>
     </message>
     <message>
         <source>Check error logs</source>
-        <translation type="unfinished" />
+        <translation>Controlla registri errori</translation>
     </message>
     <message>
         <source>Testing...</source>
-        <translation type="unfinished" />
+        <translation>Test in corso...</translation>
     </message>
     <message>
         <source>All Tests Complete</source>
-        <translation type="unfinished" />
+        <translation>Tutti i test completati</translation>
     </message>
     <message>
         <source>Self Tests Canceled</source>
-        <translation type="unfinished" />
+        <translation>Autotest annullati</translation>
     </message>
 </context>
 <context>

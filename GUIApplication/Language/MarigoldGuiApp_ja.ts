@@ -5,77 +5,77 @@
     <name>CalibrationNeededPopup</name>
     <message>
         <source>Calibration Required</source>
-        <translation type="unfinished" />
+        <translation>校正が必要です</translation>
     </message>
     <message>
         <source>New measurements cannot be made until the instrument is calibrated. Press Calibrate to start the calibration sequence.</source>
-        <translation type="unfinished" />
+        <translation>機器を校正するまで新しい測定はできません。「校正」を押して校正を開始してください。</translation>
     </message>
     <message>
         <source>Ignore</source>
-        <translation type="unfinished" />
+        <translation>無視</translation>
     </message>
     <message>
         <source>Calibrate</source>
-        <translation type="unfinished" />
+        <translation>校正</translation>
     </message>
     <message>
         <source>Calibration needed within %1 %2</source>
-        <translation type="unfinished" />
+        <translation>%1 %2以内に校正が必要です</translation>
     </message>
     <message>
         <source>seconds</source>
-        <translation type="unfinished" />
+        <translation>秒</translation>
     </message>
     <message>
         <source>minutes</source>
-        <translation type="unfinished" />
+        <translation>分</translation>
     </message>
     <message>
         <source>hours</source>
-        <translation type="unfinished" />
+        <translation>時間</translation>
     </message>
     <message>
         <source>days</source>
-        <translation type="unfinished" />
+        <translation>日</translation>
     </message>
 </context>
 <context>
     <name>CalibrationPopup</name>
     <message>
         <source>Calibration Starting</source>
-        <translation type="unfinished" />
+        <translation>校正を開始します</translation>
     </message>
     <message>
         <source>Calibrating</source>
-        <translation type="unfinished">校正中</translation>
+        <translation>校正中</translation>
     </message>
     <message>
         <source>Do not touch or bump instrument</source>
-        <translation type="unfinished">機器に触れたりぶつけたりしないでください</translation>
+        <translation>機器に触れたりぶつけたりしないでください</translation>
     </message>
     <message>
         <source>Calculating</source>
-        <translation type="unfinished">計算中</translation>
+        <translation>計算中</translation>
     </message>
     <message>
         <source>Complete</source>
-        <translation type="unfinished">完了</translation>
+        <translation>完了</translation>
     </message>
     <message>
         <source>OK to move instrument</source>
-        <translation type="unfinished">機器を動かしてもかまいません</translation>
+        <translation>機器を動かしてもかまいません</translation>
     </message>
 </context>
 <context>
     <name>CalibrationReferenceCheckPopup</name>
     <message>
         <source>Measurement Starting</source>
-        <translation type="unfinished" />
+        <translation>測定を開始します</translation>
     </message>
     <message>
         <source>Measuring</source>
-        <translation type="unfinished">測定中</translation>
+        <translation>測定中</translation>
     </message>
 </context>
 <context>
@@ -122,49 +122,49 @@
     <name>CalibrationSensorPopup</name>
     <message>
         <source>Not all pressure sensors are active. Press the OK button to start the calibration when all pressure sensors are active</source>
-        <translation type="unfinished" />
+        <translation>反応していない圧力センサーがあります。すべて反応したら OK で校正を開始してください</translation>
     </message>
     <message>
         <source>Incorrect Position</source>
-        <translation type="unfinished" />
+        <translation>位置が正しくありません</translation>
     </message>
     <message>
         <source>OK</source>
-        <translation type="unfinished">OK</translation>
+        <translation>OK</translation>
     </message>
     <message>
         <source>Cancel</source>
-        <translation type="unfinished">キャンセル</translation>
+        <translation>キャンセル</translation>
     </message>
 </context>
 <context>
     <name>CalibrationStep2PageContents</name>
     <message>
         <source>PLACE ON A FLAT SURFACE</source>
-        <translation type="unfinished" />
+        <translation>平らな面に置く</translation>
     </message>
     <message>
         <source>ALIGN WHITE LINE</source>
-        <translation type="unfinished" />
+        <translation>白線を合わせる</translation>
     </message>
 </context>
 <context>
     <name>CalibrationStep3PageContents</name>
     <message>
         <source>Tap the calibrate button to start calibration</source>
-        <translation type="unfinished" />
+        <translation>校正ボタンをタップして校正を開始します</translation>
     </message>
     <message>
         <source>Calibrate</source>
-        <translation type="unfinished" />
+        <translation>校正</translation>
     </message>
     <message>
         <source>or</source>
-        <translation type="unfinished" />
+        <translation>または</translation>
     </message>
     <message>
         <source>Press the measurement button on the instrument</source>
-        <translation type="unfinished" />
+        <translation>機器の測定ボタンを押します</translation>
     </message>
 </context>
 <context>
@@ -186,18 +186,65 @@
     <name>CalibrationWizardPage</name>
     <message>
         <source>Step 1</source>
-        <translation type="unfinished" />
+        <translation>ステップ 1</translation>
     </message>
     <message>
         <source>Step %1</source>
-        <translation type="unfinished" />
+        <translation>ステップ %1</translation>
+    </message>
+</context>
+<context>
+    <name>CalibrationWizardPageContainer</name>
+    <message>
+        <source>Tap the self test button to start self testing</source>
+        <translation>自己診断ボタンをタップして自己診断を開始します</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>自己診断</translation>
+    </message>
+    <message>
+        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
+        <translation>付属の白色基準タイルを使用して機器を校正します。</translation>
+    </message>
+    <message>
+        <source>Serial Number: %1</source>
+        <translation>シリアル番号: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
+        <translation>白線を基準に合わせて、機器を白色校正タイルの上に置きます。</translation>
+    </message>
+    <message>
+        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>付属のエフェクト基準タイルを使用して機器を確認します。シリアル番号: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
+        <translation>白線を基準に合わせて、機器をエフェクト基準タイルの上に置きます</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
+        <translation>付属の白色基準タイルを使用して機器の自己診断を行います。シリアル番号: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
+        <translation>白線を基準に合わせて、機器を白色基準タイルの上に置きます</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>付属のエフェクト基準タイルを使用して機器の自己診断を行います。シリアル番号: %1</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
+        <translation>機器を持ち上げて空中に保持し（何にも置かずに）自己診断を行います</translation>
     </message>
 </context>
 <context>
     <name>CalibrationWizardScreen</name>
     <message>
         <source>Calibration</source>
-        <translation type="unfinished" />
+        <translation>校正</translation>
     </message>
     <message>
         <source>Calibrate</source>
@@ -209,11 +256,11 @@
     </message>
     <message>
         <source>Self Test %1: %2</source>
-        <translation type="unfinished" />
+        <translation>自己診断 %1: %2</translation>
     </message>
     <message>
         <source>Reference Tile Check</source>
-        <translation type="unfinished" />
+        <translation>基準タイル確認</translation>
     </message>
 </context>
 <context>
@@ -782,85 +829,85 @@
     <name>SelfTestListItem</name>
     <message>
         <source>Pass</source>
-        <translation type="unfinished" />
+        <translation>合格</translation>
     </message>
     <message>
         <source>Fail</source>
-        <translation type="unfinished" />
+        <translation>不合格</translation>
     </message>
     <message>
         <source>Canceled</source>
-        <translation type="unfinished" />
+        <translation>キャンセル</translation>
     </message>
     <message>
         <source>Error</source>
-        <translation type="unfinished">エラー</translation>
+        <translation>エラー</translation>
     </message>
 </context>
 <context>
     <name>SelfTestPopup</name>
     <message>
         <source>Hold the instrument in open air</source>
-        <translation type="unfinished" />
+        <translation>機器を空中に保持してください</translation>
     </message>
     <message>
         <source>Do not touch or bump instrument</source>
-        <translation type="unfinished">機器に触れたりぶつけたりしないでください</translation>
+        <translation>機器に触れたりぶつけたりしないでください</translation>
     </message>
     <message>
         <source>Complete</source>
-        <translation type="unfinished">完了</translation>
+        <translation>完了</translation>
     </message>
 </context>
 <context>
     <name>SelfTestScreen</name>
     <message>
         <source>Self Test</source>
-        <translation type="unfinished" />
+        <translation>自己診断</translation>
     </message>
     <message>
         <source>OK</source>
-        <translation type="unfinished">OK</translation>
+        <translation>OK</translation>
     </message>
     <message>
         <source>White Calibration</source>
-        <translation type="unfinished" />
+        <translation>白色校正</translation>
     </message>
     <message>
         <source>Reference check on white</source>
-        <translation type="unfinished" />
+        <translation>白色での基準確認</translation>
     </message>
     <message>
         <source>Effect tile test</source>
-        <translation type="unfinished" />
+        <translation>エフェクトタイル試験</translation>
     </message>
     <message>
         <source>Repeatability tests</source>
-        <translation type="unfinished" />
+        <translation>再現性試験</translation>
     </message>
     <message>
         <source>Temperature tests</source>
-        <translation type="unfinished" />
+        <translation>温度試験</translation>
     </message>
     <message>
         <source>Pressure sensor test</source>
-        <translation type="unfinished" />
+        <translation>圧力センサー試験</translation>
     </message>
     <message>
         <source>Check error logs</source>
-        <translation type="unfinished" />
+        <translation>エラーログ確認</translation>
     </message>
     <message>
         <source>Testing...</source>
-        <translation type="unfinished" />
+        <translation>診断中...</translation>
     </message>
     <message>
         <source>All Tests Complete</source>
-        <translation type="unfinished" />
+        <translation>すべての診断が完了しました</translation>
     </message>
     <message>
         <source>Self Tests Canceled</source>
-        <translation type="unfinished" />
+        <translation>自己診断がキャンセルされました</translation>
     </message>
 </context>
 <context>

@@ -7,6 +7,7 @@
 #include "GUIAPI/MeasureAPI.h"
 #include "SharedSystem/Instrument.h"
 
+#include <QEvent>
 #include <QLabel>
 #include <QPointer>
 
@@ -39,6 +40,12 @@ CalibrationPopup::CalibrationPopup(QWidget* parent)
     big.setBold(true);
     m_pNumberLabel->setFont(big);
     m_pNumberLabel->setStyleSheet(QStringLiteral("color: rgb(45, 45, 45); background: transparent;"));
+
+    // Room for the longer translations of the texts under the ring.
+    ui->labelSubText->setGeometry(20, 312, 280, 60);
+    ui->labelWarningSubText->setGeometry(20, 374, 280, 64);
+    ui->labelSubText->setWordWrap(true);
+    ui->labelText->setWordWrap(true);
 
     m_countdownTimer.setObjectName(QStringLiteral("countdownTimer"));
     m_closeTimer.setSingleShot(true);
@@ -188,12 +195,35 @@ void CalibrationPopup::onCountdownTimer()
     triggerCalibration();
 }
 
+void CalibrationPopup::changeEvent(QEvent* event)
+{
+    // The form's own texts come back with a new language; the state's are
+    // put over them again.
+    MeasuringPopup::changeEvent(event);
+    if (event->type() != QEvent::LanguageChange)
+        return;
+    switch (m_state) {
+    case STATE_POPUP_INIT: ui->labelText->setText(startingText()); break;
+    case STATE_POPUP_MEASURING: ui->labelText->setText(measuringText()); break;
+    case STATE_POPUP_CALCULATING: ui->labelText->setText(tr("Calculating")); break;
+    case STATE_POPUP_COMPLETE:
+        ui->labelText->setText(tr("Complete"));
+        ui->labelSubText->setText(tr("OK to move instrument"));
+        break;
+    default: break;
+    }
+    ui->labelWarningSubText->setText(tr("Do not touch or bump instrument"));
+}
+
 bool CalibrationPopup::waitForIdle()
 {
+    // A popup put away during the wait (its deletion may wait for this loop
+    // to end) must not start anything afterwards.
     QPointer<CalibrationPopup> self(this);
-    while (self && DataManager::instance()->getSystemStatus().getSystemState() != STATE_INIT)
+    while (self && !self->isHidden()
+           && DataManager::instance()->getSystemStatus().getSystemState() != STATE_INIT)
         Delay(kIdlePollMs);
-    return !self.isNull();
+    return self && !self->isHidden();
 }
 
 void CalibrationPopup::triggerCalibration()

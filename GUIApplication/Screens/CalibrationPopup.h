@@ -35,6 +35,7 @@ public slots:
     virtual void triggerCalibration();
 
 protected:
+    void changeEvent(QEvent* event) override;
     // The texts of the start and of the measuring state.
     virtual QString startingText() const;
     virtual QString measuringText() const;

@@ -32,9 +32,9 @@ CalibrationWizardScreen::CalibrationWizardScreen(CALIBRATION_STATES state, QWidg
     QPalette ground = palette();
     ground.setColor(QPalette::Window, QColor(245, 245, 246));
     setPalette(ground);
+    // A long translated title takes two lines before it gets smaller.
+    ui->TxtTitle->setWordWrap(true);
     ui->TxtTitle->setAutoSize(true);
-    ui->BtnCalibrate->setAccessibleName(tr("Calibrate"));
-    ui->BtnBack->setAccessibleName(tr("Back"));
 
     API_SignalMaster* hub = API_SignalMaster::instance();
     connect(hub, &API_SignalMaster::CalibrationComplete, this, &CalibrationWizardScreen::onCalibrationComplete);

@@ -4,12 +4,20 @@
 
 #include "GUIAPI/API_SignalMaster.h"
 
+#include <QEvent>
+
 SelfTestPopup::SelfTestPopup(const QString& testName, SELF_TEST_TYPE type, QWidget* parent)
     : MeasuringPopup(parent)
     , m_testName(testName)
     , m_testType(type)
 {
     setObjectName(QStringLiteral("SelfTestPopup"));
+    // A test's name can be long: two lines above the ring.
+    ui->labelText->setGeometry(20, 32, 280, 64);
+    ui->labelText->setWordWrap(true);
+    ui->labelSubText->setGeometry(20, 312, 280, 60);
+    ui->labelWarningSubText->setGeometry(20, 374, 280, 64);
+    ui->labelSubText->setWordWrap(true);
     connect(API_SignalMaster::instance(), &API_SignalMaster::SelfTestTestComplete, this,
             &SelfTestPopup::onSelfTestTestComplete);
     setState(STATE_POPUP_INIT);
@@ -79,6 +87,16 @@ void SelfTestPopup::onUpdateSystemState(SYSTEM_STATE_T state)
         break;
     default:
         break;
+    }
+}
+
+void SelfTestPopup::changeEvent(QEvent* event)
+{
+    MeasuringPopup::changeEvent(event);
+    if (event->type() == QEvent::LanguageChange) {
+        const int percent = ui->progressBarCircle->value();
+        setState(m_state);
+        ui->progressBarCircle->setValue(percent);
     }
 }
 

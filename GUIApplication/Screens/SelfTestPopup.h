@@ -20,6 +20,9 @@ public slots:
     void onUpdateSystemState(SYSTEM_STATE_T state) override;
     void onSelfTestTestComplete();
 
+protected:
+    void changeEvent(QEvent* event) override;
+
 private:
     QString m_testName;
     SELF_TEST_TYPE m_testType;

@@ -148,9 +148,10 @@ void SelfTestScreen::doNextTest()
         }
         // The screen may go while the instrument finishes something else.
         QPointer<SelfTestScreen> self(this);
-        while (self && DataManager::instance()->getSystemStatus().getSystemState() != STATE_INIT)
+        while (self && !self->isClosing()
+               && DataManager::instance()->getSystemStatus().getSystemState() != STATE_INIT)
             Delay(kIdlePollMs);
-        if (!self)
+        if (!self || self->isClosing())
             return;
         ++m_testCounter;
         MeasAPI_TriggerSelfTest(test);

@@ -7,14 +7,10 @@
 
 namespace {
 
-QString tr(const char* text)
+// One context for the texts of every set-up's pages.
+QString trc(const char* text)
 {
     return QCoreApplication::translate("CalibrationWizardPageContainer", text);
-}
-
-QString serial(const char* text)
-{
-    return tr(text).arg(CalibrationWizardPageContainer::tileSerialNumber());
 }
 
 } // namespace
@@ -87,11 +83,11 @@ void CalibrationWizardPageContainer::buildTileSteps(StepText step1, bool effectG
 namespace {
 StepText selfTestTop()
 {
-    return [] { return tr("Tap the self test button to start self testing"); };
+    return [] { return trc("Tap the self test button to start self testing"); };
 }
 StepText selfTestButton()
 {
-    return [] { return tr("Self Test"); };
+    return [] { return trc("Self Test"); };
 }
 } // namespace
 
@@ -101,11 +97,11 @@ CalibrationWhiteWizardPageContainer::CalibrationWhiteWizardPageContainer(QWidget
     const QString number = tileSerialNumber();
     buildTileSteps(
         [number] {
-            return tr("Calibrate your instrument by using the white reference tile included with your instrument.")
-                + QStringLiteral("\n\n") + tr("Serial Number: %1").arg(number);
+            return trc("Calibrate your instrument by using the white reference tile included with your instrument.")
+                + QStringLiteral("\n\n") + trc("Serial Number: %1").arg(number);
         },
         false,
-        [] { return tr("Place the instrument on the white calibration tile by aligning the white line on the desired reference."); },
+        [] { return trc("Place the instrument on the white calibration tile by aligning the white line on the desired reference."); },
         nullptr, nullptr);
 }
 
@@ -115,11 +111,11 @@ CalibrationReferenceWizardPageContainer::CalibrationReferenceWizardPageContainer
     const QString number = tileSerialNumber();
     buildTileSteps(
         [number] {
-            return tr("Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1")
+            return trc("Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1")
                 .arg(number);
         },
         true,
-        [] { return tr("Place the instrument on the effect reference tile by aligning the white line on the desired reference"); },
+        [] { return trc("Place the instrument on the effect reference tile by aligning the white line on the desired reference"); },
         nullptr, nullptr);
 }
 
@@ -129,11 +125,11 @@ CalibrationSelfTestWhiteWizardPageContainer::CalibrationSelfTestWhiteWizardPageC
     const QString number = tileSerialNumber();
     buildTileSteps(
         [number] {
-            return tr("Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1")
+            return trc("Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1")
                 .arg(number);
         },
         false,
-        [] { return tr("Place the instrument on the white reference tile by aligning the white line on the desired reference"); },
+        [] { return trc("Place the instrument on the white reference tile by aligning the white line on the desired reference"); },
         selfTestTop(), selfTestButton());
 }
 
@@ -143,11 +139,11 @@ CalibrationSelfTestReferenceWizardPageContainer::CalibrationSelfTestReferenceWiz
     const QString number = tileSerialNumber();
     buildTileSteps(
         [number] {
-            return tr("Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1")
+            return trc("Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1")
                 .arg(number);
         },
         true,
-        [] { return tr("Place the instrument on the effect reference tile by aligning the white line on the desired reference"); },
+        [] { return trc("Place the instrument on the effect reference tile by aligning the white line on the desired reference"); },
         selfTestTop(), selfTestButton());
 }
 
@@ -156,7 +152,7 @@ CalibrationSelfTestOtherWizardPageContainer::CalibrationSelfTestOtherWizardPageC
 {
     auto* first = new CalibrationStep1PageContents;
     first->setDescriptionText(
-        [] { return tr("Self test your instrument by lifting the instrument into open air (not placed on anything)"); });
+        [] { return trc("Self test your instrument by lifting the instrument into open air (not placed on anything)"); });
     first->setBackgroundToLifted();
     createStep(1, false, true)->addPageContents(first);
     addStartStep(2, selfTestTop(), selfTestButton());

@@ -18,6 +18,7 @@ SelfTestListItem::SelfTestListItem(const QString& name, const QString& shown, QW
     ui->setupUi(this);
     setFixedSize(320, 62);
     ui->labelName->setAutoSize(true);
+    ui->labelResult->setWordWrap(true);
     ui->labelResult->setAutoSize(true);
     ui->labelName->setText(shown);
     setResult(0);

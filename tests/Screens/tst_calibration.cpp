@@ -46,6 +46,7 @@ private slots:
     void stepPagesOfEachSetUp();
     void wholeWhiteCalibrationThenReferenceCheck();
     void measurementKeyDuringCountdownIsIgnored();
+    void triggerWaitsForAnIdleInstrument();
     void failingCalibrationKeepsTheWizard();
     void liftedFootDuringCalibrationFails();
     void sensorWarningShowsLiveLampsAndChecksAgain();
@@ -328,6 +329,49 @@ void tst_Calibration::measurementKeyDuringCountdownIsIgnored()
     QTRY_VERIFY(popup.isNull());
     QTest::qWait(3500);
     QCOMPARE(DataManager::instance()->getSystemStatus().getSystemState(), STATE_INIT);
+}
+
+void tst_Calibration::triggerWaitsForAnIdleInstrument()
+{
+    // The wait runs the event loop inside the popup's last tick, so what the
+    // user does meanwhile is scheduled ahead, as it would arrive.
+    control("busy on");
+    QTRY_VERIFY_WITH_TIMEOUT(DataManager::instance()->getSystemStatus().getSystemState() == STATE_BUSY, 10000);
+    CalibrationWizardScreen* screen = openSteps(CAL_WIZARD_STEPS_INSTRUCTIONS_ID);
+    screen->onGotoCalibratingPopup();
+    QPointer<CalibrationPopup> popup = screen->calibrationPopup();
+    QPointer<CalibrationWizardScreen> alive(screen);
+    bool waitedUntriggered = false;
+    // Busy at the end of the count: the trigger waits; left meanwhile, it
+    // never comes, even once the instrument is free again.
+    QTimer::singleShot(3600, this, [&] {
+        waitedUntriggered = popup && popup->counter() == 0 && !popup->isTriggered();
+        if (alive)
+            alive->findChild<QPushButton*>("BtnBack")->click();
+    });
+    QTimer::singleShot(3900, this, [&] { control("busy off"); });
+    QTest::qWait(4200);
+    QVERIFY(waitedUntriggered);
+    waitIdle();
+    QTest::qWait(1500);
+    QCOMPARE(DataManager::instance()->getSystemStatus().getSystemState(), STATE_INIT);
+    QVERIFY(popup.isNull() || !popup->isTriggered());
+    QTRY_VERIFY(popup.isNull());
+
+    // Busy, then free while the popup stands: the calibration runs.
+    control("busy on");
+    QTRY_VERIFY_WITH_TIMEOUT(DataManager::instance()->getSystemStatus().getSystemState() == STATE_BUSY, 10000);
+    screen = openSteps(CAL_WIZARD_STEPS_INSTRUCTIONS_ID);
+    screen->onGotoCalibratingPopup();
+    popup = screen->calibrationPopup();
+    waitedUntriggered = false;
+    QTimer::singleShot(3600, this, [&] {
+        waitedUntriggered = popup && popup->counter() == 0 && !popup->isTriggered();
+        control("busy off");
+    });
+    QTRY_VERIFY_WITH_TIMEOUT(popup && popup->isTriggered(), 15000);
+    QVERIFY(waitedUntriggered);
+    QTRY_COMPARE_WITH_TIMEOUT(screen->calibrationState(), CALIBRATION_REFERENCE_CHECK_STATE, 20000);
 }
 
 void tst_Calibration::failingCalibrationKeepsTheWizard()
