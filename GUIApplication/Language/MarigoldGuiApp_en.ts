@@ -79,46 +79,6 @@
     </message>
 </context>
 <context>
-    <name>CalibrationReferenceWizardPageContainer</name>
-    <message>
-        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
-        <translation>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</translation>
-    </message>
-    <message>
-        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
-        <translation>Place the instrument on the effect reference tile by aligning the white line on the desired reference</translation>
-    </message>
-</context>
-<context>
-    <name>CalibrationSelfTestOtherWizardPageContainer</name>
-    <message>
-        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
-        <translation>Self test your instrument by lifting the instrument into open air (not placed on anything)</translation>
-    </message>
-</context>
-<context>
-    <name>CalibrationSelfTestReferenceWizardPageContainer</name>
-    <message>
-        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
-        <translation>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</translation>
-    </message>
-    <message>
-        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
-        <translation>Place the instrument on the effect reference tile by aligning the white line on the desired reference</translation>
-    </message>
-</context>
-<context>
-    <name>CalibrationSelfTestWhiteWizardPageContainer</name>
-    <message>
-        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
-        <translation>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</translation>
-    </message>
-    <message>
-        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
-        <translation>Place the instrument on the white reference tile by aligning the white line on the desired reference</translation>
-    </message>
-</context>
-<context>
     <name>CalibrationSensorPopup</name>
     <message>
         <source>Not all pressure sensors are active. Press the OK button to start the calibration when all pressure sensors are active</source>
@@ -168,21 +128,6 @@
     </message>
 </context>
 <context>
-    <name>CalibrationWhiteWizardPageContainer</name>
-    <message>
-        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
-        <translation>Calibrate your instrument by using the white reference tile included with your instrument.</translation>
-    </message>
-    <message>
-        <source>Serial Number: %1</source>
-        <translation>Serial Number: %1</translation>
-    </message>
-    <message>
-        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
-        <translation>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</translation>
-    </message>
-</context>
-<context>
     <name>CalibrationWizardPage</name>
     <message>
         <source>Step 1</source>
@@ -194,65 +139,10 @@
     </message>
 </context>
 <context>
-    <name>CalibrationWizardPageContainer</name>
-    <message>
-        <source>Tap the self test button to start self testing</source>
-        <translation>Tap the self test button to start self testing</translation>
-    </message>
-    <message>
-        <source>Self Test</source>
-        <translation>Self Test</translation>
-    </message>
-    <message>
-        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
-        <translation>Calibrate your instrument by using the white reference tile included with your instrument.</translation>
-    </message>
-    <message>
-        <source>Serial Number: %1</source>
-        <translation>Serial Number: %1</translation>
-    </message>
-    <message>
-        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
-        <translation>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</translation>
-    </message>
-    <message>
-        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
-        <translation>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</translation>
-    </message>
-    <message>
-        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
-        <translation>Place the instrument on the effect reference tile by aligning the white line on the desired reference</translation>
-    </message>
-    <message>
-        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
-        <translation>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</translation>
-    </message>
-    <message>
-        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
-        <translation>Place the instrument on the white reference tile by aligning the white line on the desired reference</translation>
-    </message>
-    <message>
-        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
-        <translation>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</translation>
-    </message>
-    <message>
-        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
-        <translation>Self test your instrument by lifting the instrument into open air (not placed on anything)</translation>
-    </message>
-</context>
-<context>
     <name>CalibrationWizardScreen</name>
     <message>
         <source>Calibration</source>
         <translation>Calibration</translation>
-    </message>
-    <message>
-        <source>Calibrate</source>
-        <translation>Calibrate</translation>
-    </message>
-    <message>
-        <source>Back</source>
-        <translation>Back</translation>
     </message>
     <message>
         <source>Self Test %1: %2</source>
@@ -950,12 +840,12 @@
 <context>
     <name>SettingsFileViewerPage</name>
     <message>
-        <source>The file can't be shown.</source>
-        <translation>The file can't be shown.</translation>
+        <source>The file can&apos;t be shown.</source>
+        <translation>The file can&apos;t be shown.</translation>
     </message>
     <message>
-        <source>The file can't be read.</source>
-        <translation>The file can't be read.</translation>
+        <source>The file can&apos;t be read.</source>
+        <translation>The file can&apos;t be read.</translation>
     </message>
 </context>
 <context>
@@ -1718,8 +1608,8 @@ Diagnostics</translation>
         <translation>Job Time Elapsed</translation>
     </message>
     <message>
-        <source>The job wasn't completed within the allocated time</source>
-        <translation>The job wasn't completed within the allocated time</translation>
+        <source>The job wasn&apos;t completed within the allocated time</source>
+        <translation>The job wasn&apos;t completed within the allocated time</translation>
     </message>
     <message>
         <source>SMC force finished, all readings averaged for result.</source>

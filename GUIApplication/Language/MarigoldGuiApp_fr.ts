@@ -9,7 +9,7 @@
     </message>
     <message>
         <source>New measurements cannot be made until the instrument is calibrated. Press Calibrate to start the calibration sequence.</source>
-        <translation>Aucune nouvelle mesure n'est possible avant l'étalonnage de l'instrument. Appuyez sur Étalonner pour lancer l'étalonnage.</translation>
+        <translation>Aucune nouvelle mesure n&apos;est possible avant l&apos;étalonnage de l&apos;instrument. Appuyez sur Étalonner pour lancer l&apos;étalonnage.</translation>
     </message>
     <message>
         <source>Ignore</source>
@@ -44,7 +44,7 @@
     <name>CalibrationPopup</name>
     <message>
         <source>Calibration Starting</source>
-        <translation>Début de l'étalonnage</translation>
+        <translation>Début de l&apos;étalonnage</translation>
     </message>
     <message>
         <source>Calibrating</source>
@@ -52,7 +52,7 @@
     </message>
     <message>
         <source>Do not touch or bump instrument</source>
-        <translation>Ne touchez pas et ne heurtez pas l'instrument</translation>
+        <translation>Ne touchez pas et ne heurtez pas l&apos;instrument</translation>
     </message>
     <message>
         <source>Calculating</source>
@@ -64,7 +64,7 @@
     </message>
     <message>
         <source>OK to move instrument</source>
-        <translation>Vous pouvez déplacer l'instrument</translation>
+        <translation>Vous pouvez déplacer l&apos;instrument</translation>
     </message>
 </context>
 <context>
@@ -79,50 +79,10 @@
     </message>
 </context>
 <context>
-    <name>CalibrationReferenceWizardPageContainer</name>
-    <message>
-        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
-        <translation type="unfinished" />
-    </message>
-    <message>
-        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
-        <translation type="unfinished" />
-    </message>
-</context>
-<context>
-    <name>CalibrationSelfTestOtherWizardPageContainer</name>
-    <message>
-        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
-        <translation type="unfinished" />
-    </message>
-</context>
-<context>
-    <name>CalibrationSelfTestReferenceWizardPageContainer</name>
-    <message>
-        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
-        <translation type="unfinished" />
-    </message>
-    <message>
-        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
-        <translation type="unfinished" />
-    </message>
-</context>
-<context>
-    <name>CalibrationSelfTestWhiteWizardPageContainer</name>
-    <message>
-        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
-        <translation type="unfinished" />
-    </message>
-    <message>
-        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
-        <translation type="unfinished" />
-    </message>
-</context>
-<context>
     <name>CalibrationSensorPopup</name>
     <message>
         <source>Not all pressure sensors are active. Press the OK button to start the calibration when all pressure sensors are active</source>
-        <translation>Tous les capteurs de pression ne sont pas actifs. Appuyez sur OK pour lancer l'étalonnage lorsque tous les capteurs sont actifs</translation>
+        <translation>Tous les capteurs de pression ne sont pas actifs. Appuyez sur OK pour lancer l&apos;étalonnage lorsque tous les capteurs sont actifs</translation>
     </message>
     <message>
         <source>Incorrect Position</source>
@@ -152,7 +112,7 @@
     <name>CalibrationStep3PageContents</name>
     <message>
         <source>Tap the calibrate button to start calibration</source>
-        <translation>Touchez le bouton Étalonner pour lancer l'étalonnage</translation>
+        <translation>Touchez le bouton Étalonner pour lancer l&apos;étalonnage</translation>
     </message>
     <message>
         <source>Calibrate</source>
@@ -164,22 +124,7 @@
     </message>
     <message>
         <source>Press the measurement button on the instrument</source>
-        <translation>Appuyez sur le bouton de mesure de l'instrument</translation>
-    </message>
-</context>
-<context>
-    <name>CalibrationWhiteWizardPageContainer</name>
-    <message>
-        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
-        <translation type="unfinished" />
-    </message>
-    <message>
-        <source>Serial Number: %1</source>
-        <translation type="unfinished" />
-    </message>
-    <message>
-        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
-        <translation type="unfinished" />
+        <translation>Appuyez sur le bouton de mesure de l&apos;instrument</translation>
     </message>
 </context>
 <context>
@@ -194,65 +139,10 @@
     </message>
 </context>
 <context>
-    <name>CalibrationWizardPageContainer</name>
-    <message>
-        <source>Tap the self test button to start self testing</source>
-        <translation>Touchez le bouton Autotest pour lancer l'autotest</translation>
-    </message>
-    <message>
-        <source>Self Test</source>
-        <translation>Autotest</translation>
-    </message>
-    <message>
-        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
-        <translation>Étalonnez votre instrument avec la plaque de référence blanche fournie.</translation>
-    </message>
-    <message>
-        <source>Serial Number: %1</source>
-        <translation>Numéro de série : %1</translation>
-    </message>
-    <message>
-        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
-        <translation>Posez l'instrument sur la plaque d'étalonnage blanche en alignant la ligne blanche sur le repère.</translation>
-    </message>
-    <message>
-        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
-        <translation>Vérifiez votre instrument avec la plaque de référence à effet fournie. Numéro de série : %1</translation>
-    </message>
-    <message>
-        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
-        <translation>Posez l'instrument sur la plaque de référence à effet en alignant la ligne blanche sur le repère</translation>
-    </message>
-    <message>
-        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
-        <translation>Effectuez l'autotest avec la plaque de référence blanche fournie. Numéro de série : %1</translation>
-    </message>
-    <message>
-        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
-        <translation>Posez l'instrument sur la plaque de référence blanche en alignant la ligne blanche sur le repère</translation>
-    </message>
-    <message>
-        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
-        <translation>Effectuez l'autotest avec la plaque de référence à effet fournie. Numéro de série : %1</translation>
-    </message>
-    <message>
-        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
-        <translation>Effectuez l'autotest en tenant l'instrument en l'air (posé sur rien)</translation>
-    </message>
-</context>
-<context>
     <name>CalibrationWizardScreen</name>
     <message>
         <source>Calibration</source>
         <translation>Étalonnage</translation>
-    </message>
-    <message>
-        <source>Calibrate</source>
-        <translation type="unfinished" />
-    </message>
-    <message>
-        <source>Back</source>
-        <translation type="unfinished">Retour</translation>
     </message>
     <message>
         <source>Self Test %1: %2</source>
@@ -295,7 +185,7 @@
     </message>
     <message>
         <source>The instrument was moved during a measurement</source>
-        <translation>L'instrument a été déplacé pendant la mesure</translation>
+        <translation>L&apos;instrument a été déplacé pendant la mesure</translation>
     </message>
     <message>
         <source>Index invalid</source>
@@ -303,7 +193,7 @@
     </message>
     <message>
         <source>Calibration Error</source>
-        <translation>Erreur d'étalonnage</translation>
+        <translation>Erreur d&apos;étalonnage</translation>
     </message>
     <message>
         <source>Instrument not on white tile, or internal white dirty</source>
@@ -311,7 +201,7 @@
     </message>
     <message>
         <source>Calibration data not valid</source>
-        <translation>Données d'étalonnage non valides</translation>
+        <translation>Données d&apos;étalonnage non valides</translation>
     </message>
     <message>
         <source>Not calibrated</source>
@@ -327,7 +217,7 @@
     </message>
     <message>
         <source>The measurement has been aborted by the user</source>
-        <translation>La mesure a été interrompue par l'utilisateur</translation>
+        <translation>La mesure a été interrompue par l&apos;utilisateur</translation>
     </message>
     <message>
         <source>Battery is low. Charge the battery</source>
@@ -335,11 +225,11 @@
     </message>
     <message>
         <source>Battery is empty. Instrument will shut down</source>
-        <translation>Batterie vide. L'instrument va s'éteindre</translation>
+        <translation>Batterie vide. L&apos;instrument va s&apos;éteindre</translation>
     </message>
     <message>
         <source>Error in shutter motor</source>
-        <translation>Erreur du moteur d'obturateur</translation>
+        <translation>Erreur du moteur d&apos;obturateur</translation>
     </message>
     <message>
         <source>No stored reference measurement</source>
@@ -347,11 +237,11 @@
     </message>
     <message>
         <source>Spectral integration time on white too long</source>
-        <translation>Temps d'intégration spectrale sur le blanc trop long</translation>
+        <translation>Temps d&apos;intégration spectrale sur le blanc trop long</translation>
     </message>
     <message>
         <source>Wavelength shift above absolute limit of 5 nm</source>
-        <translation>Décalage de longueur d'onde au-delà de la limite de 5 nm</translation>
+        <translation>Décalage de longueur d&apos;onde au-delà de la limite de 5 nm</translation>
     </message>
     <message>
         <source>Low Storage</source>
@@ -367,11 +257,11 @@
     </message>
     <message>
         <source>Sample temperature too high (IR Sensor)</source>
-        <translation>Température de l'échantillon trop élevée (capteur IR)</translation>
+        <translation>Température de l&apos;échantillon trop élevée (capteur IR)</translation>
     </message>
     <message>
         <source>Sample temperature too low (IR Sensor)</source>
-        <translation>Température de l'échantillon trop basse (capteur IR)</translation>
+        <translation>Température de l&apos;échantillon trop basse (capteur IR)</translation>
     </message>
     <message>
         <source>Battery level is too low for update</source>
@@ -383,11 +273,11 @@
     </message>
     <message>
         <source>Problem during initialization. Please reboot the device</source>
-        <translation>Problème lors de l'initialisation. Redémarrez l'appareil</translation>
+        <translation>Problème lors de l&apos;initialisation. Redémarrez l&apos;appareil</translation>
     </message>
     <message>
         <source>Hardware communication error. Please reboot the device</source>
-        <translation>Erreur de communication matérielle. Redémarrez l'appareil</translation>
+        <translation>Erreur de communication matérielle. Redémarrez l&apos;appareil</translation>
     </message>
     <message>
         <source>Error during measurement</source>
@@ -414,7 +304,7 @@
     </message>
     <message>
         <source>Are you sure you want to clear the database, this will delete all samples and jobs from the instrument?</source>
-        <translation>Voulez-vous vraiment effacer la base de données ? Tous les échantillons et travaux de l'instrument seront supprimés.</translation>
+        <translation>Voulez-vous vraiment effacer la base de données ? Tous les échantillons et travaux de l&apos;instrument seront supprimés.</translation>
     </message>
 </context>
 <context>
@@ -436,7 +326,7 @@
     <name>DeleteSamplePopup</name>
     <message>
         <source>Delete Sample?</source>
-        <translation>Supprimer l'échantillon ?</translation>
+        <translation>Supprimer l&apos;échantillon ?</translation>
     </message>
     <message>
         <source>Delete</source>
@@ -485,7 +375,7 @@
     <name>JobFreeTextEditScreen</name>
     <message>
         <source>Notes</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -496,11 +386,11 @@
     </message>
     <message>
         <source>ABC</source>
-        <translation type="unfinished" />
+        <translation type="unfinished">ABC</translation>
     </message>
     <message>
         <source>Special Keys</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -562,7 +452,7 @@
     </message>
     <message>
         <source>A new job cannot be created until one or more existing jobs are removed from the instrument.</source>
-        <translation>Impossible de créer un travail tant qu'un ou plusieurs travaux n'ont pas été supprimés de l'instrument.</translation>
+        <translation>Impossible de créer un travail tant qu&apos;un ou plusieurs travaux n&apos;ont pas été supprimés de l&apos;instrument.</translation>
     </message>
     <message>
         <source>There is not enough memory to complete the requested Job. Please remove existing jobs to free up memory.</source>
@@ -637,7 +527,7 @@
     </message>
     <message>
         <source>This job was not created on the instrument. Are you sure you want to edit the job?</source>
-        <translation>Ce travail n'a pas été créé sur l'instrument. Voulez-vous vraiment le modifier ?</translation>
+        <translation>Ce travail n&apos;a pas été créé sur l&apos;instrument. Voulez-vous vraiment le modifier ?</translation>
     </message>
     <message>
         <source>Edit</source>
@@ -652,34 +542,34 @@
     <name>JobNameEditScreen</name>
     <message>
         <source>Name</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Job Name cannot be empty</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Enter a unique job name that is not empty</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Job Name Already Exists</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>This job name already exists.  Please change the name to a unique name</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
     <name>JobTagEditScreen</name>
     <message>
         <source>Tag Name Does Not Exist</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>This tag name does not exist. Please change the name to an existing tag name</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -690,7 +580,7 @@
     </message>
     <message>
         <source>ABC</source>
-        <translation type="unfinished" />
+        <translation type="unfinished">ABC</translation>
     </message>
 </context>
 <context>
@@ -712,7 +602,7 @@
     </message>
     <message>
         <source>Do not touch or bump instrument</source>
-        <translation>Ne touchez pas et ne heurtez pas l'instrument</translation>
+        <translation>Ne touchez pas et ne heurtez pas l&apos;instrument</translation>
     </message>
     <message>
         <source>Calculating</source>
@@ -720,7 +610,7 @@
     </message>
     <message>
         <source>OK to move instrument</source>
-        <translation>Vous pouvez déplacer l'instrument</translation>
+        <translation>Vous pouvez déplacer l&apos;instrument</translation>
     </message>
 </context>
 <context>
@@ -746,7 +636,7 @@
     </message>
     <message>
         <source>Restore Factory Settings</source>
-        <translation>Rétablir les paramètres d'usine</translation>
+        <translation>Rétablir les paramètres d&apos;usine</translation>
     </message>
     <message>
         <source>All current user settings will go back to defaults. Any jobs or samples will also be lost!</source>
@@ -761,7 +651,7 @@
     </message>
     <message>
         <source>An error has occurred, please reboot the instrument</source>
-        <translation>Une erreur s'est produite. Redémarrez l'instrument</translation>
+        <translation>Une erreur s&apos;est produite. Redémarrez l&apos;instrument</translation>
     </message>
     <message>
         <source>OK</source>
@@ -800,7 +690,7 @@
     <name>SampleListSelectionItemComplete</name>
     <message>
         <source>More measurements are needed to complete this job</source>
-        <translation>D'autres mesures sont nécessaires pour terminer ce travail</translation>
+        <translation>D&apos;autres mesures sont nécessaires pour terminer ce travail</translation>
     </message>
 </context>
 <context>
@@ -848,11 +738,11 @@
     <name>SelfTestPopup</name>
     <message>
         <source>Hold the instrument in open air</source>
-        <translation>Tenez l'instrument en l'air</translation>
+        <translation>Tenez l&apos;instrument en l&apos;air</translation>
     </message>
     <message>
         <source>Do not touch or bump instrument</source>
-        <translation>Ne touchez pas et ne heurtez pas l'instrument</translation>
+        <translation>Ne touchez pas et ne heurtez pas l&apos;instrument</translation>
     </message>
     <message>
         <source>Complete</source>
@@ -895,7 +785,7 @@
     </message>
     <message>
         <source>Check error logs</source>
-        <translation>Vérifier les journaux d'erreurs</translation>
+        <translation>Vérifier les journaux d&apos;erreurs</translation>
     </message>
     <message>
         <source>Testing...</source>
@@ -944,17 +834,17 @@
     </message>
     <message>
         <source>Display Brightness</source>
-        <translation>Luminosité de l'écran</translation>
+        <translation>Luminosité de l&apos;écran</translation>
     </message>
 </context>
 <context>
     <name>SettingsFileViewerPage</name>
     <message>
-        <source>The file can't be shown.</source>
-        <translation>Impossible d'afficher le fichier.</translation>
+        <source>The file can&apos;t be shown.</source>
+        <translation>Impossible d&apos;afficher le fichier.</translation>
     </message>
     <message>
-        <source>The file can't be read.</source>
+        <source>The file can&apos;t be read.</source>
         <translation>Impossible de lire le fichier.</translation>
     </message>
 </context>
@@ -1077,7 +967,7 @@ Arrêt après : %3</translation>
     </message>
     <message>
         <source>Power Saving Options</source>
-        <translation>Économie d'énergie</translation>
+        <translation>Économie d&apos;énergie</translation>
     </message>
     <message>
         <source>System &amp; Diagnostics</source>
@@ -1137,11 +1027,11 @@ Arrêt après : %3</translation>
         <source>Power Saving
 Options</source>
         <translation>Économie
-d'énergie</translation>
+d&apos;énergie</translation>
     </message>
     <message>
         <source>Dim Display</source>
-        <translation>Atténuer l'écran</translation>
+        <translation>Atténuer l&apos;écran</translation>
     </message>
     <message>
         <source>Standby Mode</source>
@@ -1161,7 +1051,7 @@ d'énergie</translation>
     </message>
     <message>
         <source>Minutes until power off:</source>
-        <translation>Minutes avant l'arrêt :</translation>
+        <translation>Minutes avant l&apos;arrêt :</translation>
     </message>
 </context>
 <context>
@@ -1180,11 +1070,11 @@ d'énergie</translation>
     </message>
     <message>
         <source>Shutdown Instrument?</source>
-        <translation>Éteindre l'instrument ?</translation>
+        <translation>Éteindre l&apos;instrument ?</translation>
     </message>
     <message>
         <source>Are you sure you want to shutdown the instrument?</source>
-        <translation>Voulez-vous vraiment éteindre l'instrument ?</translation>
+        <translation>Voulez-vous vraiment éteindre l&apos;instrument ?</translation>
     </message>
     <message>
         <source>Enter Standby Mode?</source>
@@ -1192,15 +1082,15 @@ d'énergie</translation>
     </message>
     <message>
         <source>Are you sure you want to put the instrument into standby mode?</source>
-        <translation>Voulez-vous vraiment mettre l'instrument en veille ?</translation>
+        <translation>Voulez-vous vraiment mettre l&apos;instrument en veille ?</translation>
     </message>
     <message>
         <source>Reboot Instrument?</source>
-        <translation>Redémarrer l'instrument ?</translation>
+        <translation>Redémarrer l&apos;instrument ?</translation>
     </message>
     <message>
         <source>Are you sure you want to reboot the instrument?</source>
-        <translation>Voulez-vous vraiment redémarrer l'instrument ?</translation>
+        <translation>Voulez-vous vraiment redémarrer l&apos;instrument ?</translation>
     </message>
     <message>
         <source>Yes</source>
@@ -1272,7 +1162,7 @@ diagnostic</translation>
     </message>
     <message>
         <source>Interface Revision:</source>
-        <translation>Version de l'interface :</translation>
+        <translation>Version de l&apos;interface :</translation>
     </message>
     <message>
         <source>Kernel:</source>
@@ -1280,7 +1170,7 @@ diagnostic</translation>
     </message>
     <message>
         <source>Bootloader:</source>
-        <translation>Chargeur d'amorçage :</translation>
+        <translation>Chargeur d&apos;amorçage :</translation>
     </message>
     <message>
         <source>Server URL:</source>
@@ -1288,7 +1178,7 @@ diagnostic</translation>
     </message>
     <message>
         <source>Restore Factory Settings</source>
-        <translation>Rétablir les paramètres d'usine</translation>
+        <translation>Rétablir les paramètres d&apos;usine</translation>
     </message>
     <message>
         <source>Open Source</source>
@@ -1603,19 +1493,19 @@ diagnostic</translation>
     <name>TargetingScreen</name>
     <message>
         <source>Job</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Press button to measure.</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Targeting</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Averaged 0 of SMC 0:0</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Measure</source>
@@ -1623,15 +1513,15 @@ diagnostic</translation>
     </message>
     <message>
         <source>Terminate</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Online Mode</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Averaged %1 of SMC %2:%3</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>OK</source>
@@ -1639,27 +1529,27 @@ diagnostic</translation>
     </message>
     <message>
         <source>Exit Online Mode?</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Exiting online mode will stop targeting and return to the job list.</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Exit</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Stop Measuring?</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>All measured samples and this job will be permanently deleted.</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>All measured samples from this job will be permanently deleted.</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Warning</source>
@@ -1667,19 +1557,19 @@ diagnostic</translation>
     </message>
     <message>
         <source>Continue</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Temperature out of range.  Continue online mode until complete, or Exit online mode and return to the job list?</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Temperature out of range.  Continue job until complete, or delete job and all samples and return to the job list?</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Temperature out of range.  Continue job until complete, or delete all samples and return to the job list?</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Delete</source>
@@ -1687,11 +1577,11 @@ diagnostic</translation>
     </message>
     <message>
         <source>Override Pressure Sensors?</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Not all pressure sensors are active. Press the measure button again to start a measurement, otherwise press the cancel button to return to targeting mode.</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Cancel</source>
@@ -1699,35 +1589,35 @@ diagnostic</translation>
     </message>
     <message>
         <source>Information</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Not all pressure sensors are active. Please ensure all pressure sensors are active before measuring</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Continue Measuring?</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>To continue with measurements, press OK</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Job Time Elapsed</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
-        <source>The job wasn't completed within the allocated time</source>
-        <translation type="unfinished" />
+        <source>The job wasn&apos;t completed within the allocated time</source>
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>SMC force finished, all readings averaged for result.</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Maximum number of SMC measurements used for this job</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Complete</source>
@@ -1735,15 +1625,15 @@ diagnostic</translation>
     </message>
     <message>
         <source>The job has completed.  Press OK to exit online mode</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>SMC force finished, all readings averaged for result.  Press OK to exit online mode</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>SMC failed after maximum measurements %1, the final results are averaged.  Press OK to exit online mode</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -1765,7 +1655,7 @@ diagnostic</translation>
     <name>UndoPopup</name>
     <message>
         <source>Undo</source>
-        <translation>Annuler l'action</translation>
+        <translation>Annuler l&apos;action</translation>
     </message>
     <message>
         <source>Back</source>

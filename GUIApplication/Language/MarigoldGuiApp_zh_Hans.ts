@@ -79,46 +79,6 @@
     </message>
 </context>
 <context>
-    <name>CalibrationReferenceWizardPageContainer</name>
-    <message>
-        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
-        <translation type="unfinished" />
-    </message>
-    <message>
-        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
-        <translation type="unfinished" />
-    </message>
-</context>
-<context>
-    <name>CalibrationSelfTestOtherWizardPageContainer</name>
-    <message>
-        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
-        <translation type="unfinished" />
-    </message>
-</context>
-<context>
-    <name>CalibrationSelfTestReferenceWizardPageContainer</name>
-    <message>
-        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
-        <translation type="unfinished" />
-    </message>
-    <message>
-        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
-        <translation type="unfinished" />
-    </message>
-</context>
-<context>
-    <name>CalibrationSelfTestWhiteWizardPageContainer</name>
-    <message>
-        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
-        <translation type="unfinished" />
-    </message>
-    <message>
-        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
-        <translation type="unfinished" />
-    </message>
-</context>
-<context>
     <name>CalibrationSensorPopup</name>
     <message>
         <source>Not all pressure sensors are active. Press the OK button to start the calibration when all pressure sensors are active</source>
@@ -168,21 +128,6 @@
     </message>
 </context>
 <context>
-    <name>CalibrationWhiteWizardPageContainer</name>
-    <message>
-        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
-        <translation type="unfinished" />
-    </message>
-    <message>
-        <source>Serial Number: %1</source>
-        <translation type="unfinished" />
-    </message>
-    <message>
-        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
-        <translation type="unfinished" />
-    </message>
-</context>
-<context>
     <name>CalibrationWizardPage</name>
     <message>
         <source>Step 1</source>
@@ -194,65 +139,10 @@
     </message>
 </context>
 <context>
-    <name>CalibrationWizardPageContainer</name>
-    <message>
-        <source>Tap the self test button to start self testing</source>
-        <translation>点击自检按钮开始自检</translation>
-    </message>
-    <message>
-        <source>Self Test</source>
-        <translation>自检</translation>
-    </message>
-    <message>
-        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
-        <translation>使用仪器随附的白色参考板校准仪器。</translation>
-    </message>
-    <message>
-        <source>Serial Number: %1</source>
-        <translation>序列号：%1</translation>
-    </message>
-    <message>
-        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
-        <translation>将仪器放在白色校准板上，使白线对准参考标记。</translation>
-    </message>
-    <message>
-        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
-        <translation>使用仪器随附的效果参考板验证仪器。序列号：%1</translation>
-    </message>
-    <message>
-        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
-        <translation>将仪器放在效果参考板上，使白线对准参考标记</translation>
-    </message>
-    <message>
-        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
-        <translation>使用仪器随附的白色参考板进行自检。序列号：%1</translation>
-    </message>
-    <message>
-        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
-        <translation>将仪器放在白色参考板上，使白线对准参考标记</translation>
-    </message>
-    <message>
-        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
-        <translation>使用仪器随附的效果参考板进行自检。序列号：%1</translation>
-    </message>
-    <message>
-        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
-        <translation>将仪器提起悬空（不放在任何物体上）进行自检</translation>
-    </message>
-</context>
-<context>
     <name>CalibrationWizardScreen</name>
     <message>
         <source>Calibration</source>
         <translation>校准</translation>
-    </message>
-    <message>
-        <source>Calibrate</source>
-        <translation type="unfinished" />
-    </message>
-    <message>
-        <source>Back</source>
-        <translation type="unfinished">返回</translation>
     </message>
     <message>
         <source>Self Test %1: %2</source>
@@ -485,7 +375,7 @@
     <name>JobFreeTextEditScreen</name>
     <message>
         <source>Notes</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -496,11 +386,11 @@
     </message>
     <message>
         <source>ABC</source>
-        <translation type="unfinished" />
+        <translation type="unfinished">ABC</translation>
     </message>
     <message>
         <source>Special Keys</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -652,34 +542,34 @@
     <name>JobNameEditScreen</name>
     <message>
         <source>Name</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Job Name cannot be empty</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Enter a unique job name that is not empty</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Job Name Already Exists</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>This job name already exists.  Please change the name to a unique name</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
     <name>JobTagEditScreen</name>
     <message>
         <source>Tag Name Does Not Exist</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>This tag name does not exist. Please change the name to an existing tag name</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
@@ -690,7 +580,7 @@
     </message>
     <message>
         <source>ABC</source>
-        <translation type="unfinished" />
+        <translation type="unfinished">ABC</translation>
     </message>
 </context>
 <context>
@@ -950,11 +840,11 @@
 <context>
     <name>SettingsFileViewerPage</name>
     <message>
-        <source>The file can't be shown.</source>
+        <source>The file can&apos;t be shown.</source>
         <translation>无法显示该文件。</translation>
     </message>
     <message>
-        <source>The file can't be read.</source>
+        <source>The file can&apos;t be read.</source>
         <translation>无法读取该文件。</translation>
     </message>
 </context>
@@ -1603,19 +1493,19 @@ Diagnostics</source>
     <name>TargetingScreen</name>
     <message>
         <source>Job</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Press button to measure.</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Targeting</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Averaged 0 of SMC 0:0</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Measure</source>
@@ -1623,15 +1513,15 @@ Diagnostics</source>
     </message>
     <message>
         <source>Terminate</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Online Mode</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Averaged %1 of SMC %2:%3</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>OK</source>
@@ -1639,27 +1529,27 @@ Diagnostics</source>
     </message>
     <message>
         <source>Exit Online Mode?</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Exiting online mode will stop targeting and return to the job list.</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Exit</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Stop Measuring?</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>All measured samples and this job will be permanently deleted.</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>All measured samples from this job will be permanently deleted.</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Warning</source>
@@ -1667,19 +1557,19 @@ Diagnostics</source>
     </message>
     <message>
         <source>Continue</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Temperature out of range.  Continue online mode until complete, or Exit online mode and return to the job list?</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Temperature out of range.  Continue job until complete, or delete job and all samples and return to the job list?</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Temperature out of range.  Continue job until complete, or delete all samples and return to the job list?</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Delete</source>
@@ -1687,11 +1577,11 @@ Diagnostics</source>
     </message>
     <message>
         <source>Override Pressure Sensors?</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Not all pressure sensors are active. Press the measure button again to start a measurement, otherwise press the cancel button to return to targeting mode.</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Cancel</source>
@@ -1699,35 +1589,35 @@ Diagnostics</source>
     </message>
     <message>
         <source>Information</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Not all pressure sensors are active. Please ensure all pressure sensors are active before measuring</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Continue Measuring?</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>To continue with measurements, press OK</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Job Time Elapsed</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
-        <source>The job wasn't completed within the allocated time</source>
-        <translation type="unfinished" />
+        <source>The job wasn&apos;t completed within the allocated time</source>
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>SMC force finished, all readings averaged for result.</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Maximum number of SMC measurements used for this job</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>Complete</source>
@@ -1735,15 +1625,15 @@ Diagnostics</source>
     </message>
     <message>
         <source>The job has completed.  Press OK to exit online mode</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>SMC force finished, all readings averaged for result.  Press OK to exit online mode</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
     <message>
         <source>SMC failed after maximum measurements %1, the final results are averaged.  Press OK to exit online mode</source>
-        <translation type="unfinished" />
+        <translation type="unfinished"></translation>
     </message>
 </context>
 <context>
