@@ -24,6 +24,7 @@
 
 #include "AppShell.h"
 #include "SimServer.h"
+#include "support/ProductHarness.h"
 #include "support/TestSupport.h"
 
 #include <QPointer>
@@ -76,19 +77,7 @@ private:
 
 void tst_Calibration::initTestCase()
 {
-    m_sim.options().port = TestSupport::freeLocalPort();
-    m_sim.options().controlPort = -1;
-    m_sim.options().instrument.dataDir = TestSupport::makeTempDir(QStringLiteral("calibration-sim"));
-    m_sim.options().instrument.timeScale = 0.3;
-    QVERIFY(m_sim.start());
-    setIpAddress(QStringLiteral("127.0.0.1"));
-    setIpPort(m_sim.port());
-
-    AppShell::registerMetaTypes();
-    LocaleHelper::Init();
-    StringTables::Init();
-    AudioPlayer::instance()->Init();
-    DataManager::instance()->Init();
+    QVERIFY(ProductHarness::startSimulatorAndApplication(m_sim, QStringLiteral("calibration")));
 
     m_master = new ScreenMaster;
     m_master->show();

@@ -28,6 +28,7 @@
 
 #include "AppShell.h"
 #include "SimServer.h"
+#include "support/ProductHarness.h"
 #include "support/TestSupport.h"
 
 #include <QPushButton>
@@ -143,29 +144,9 @@ JobListScreen* tst_JobList::home() const
 
 void tst_JobList::initTestCase()
 {
-    m_sim.options().port = TestSupport::freeLocalPort();
-    m_sim.options().controlPort = -1;
-    m_sim.options().instrument.dataDir = TestSupport::makeTempDir(QStringLiteral("joblist-sim"));
-    m_sim.options().instrument.timeScale = 0.3;
-    QVERIFY(m_sim.start());
-    setIpAddress(QStringLiteral("127.0.0.1"));
-    setIpPort(m_sim.port());
+    QVERIFY(ProductHarness::startSimulatorAndApplication(m_sim, QStringLiteral("joblist")));
 
-    AppShell::registerMetaTypes();
-    LocaleHelper::Init();
-    StringTables::Init();
-    AudioPlayer::instance()->Init();
-    DataManager::instance()->Init();
-
-    ScreenMaster::setScreenFactoryOverride([](SCREEN_ID_T id, QWidget* parent) -> QWidget* {
-        if (id == JOB_LIST_SCREEN_ID || id == SAD_PUPPY_POPUP_SCREEN_ID || id == LOCK_SCREEN_ID
-            || id == SYNC_SCREEN_ID)
-            return nullptr;
-        requestedScreens() << id;
-        DaddyPanel* standIn = new DaddyPanel(parent);
-        standIn->setObjectName(QStringLiteral("StandIn%1").arg(int(id)));
-        return standIn;
-    });
+    ProductHarness::standInOtherScreens({}, [](SCREEN_ID_T id) { requestedScreens() << id; });
 
     Platform::clearRecordedCommands();
     m_master = new ScreenMaster;

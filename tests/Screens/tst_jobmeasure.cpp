@@ -31,6 +31,7 @@
 
 #include "AppShell.h"
 #include "SimServer.h"
+#include "support/ProductHarness.h"
 #include "support/TestSupport.h"
 
 #include <QPointer>
@@ -102,31 +103,11 @@ private:
 
 void tst_JobMeasure::initTestCase()
 {
-    m_sim.options().port = TestSupport::freeLocalPort();
-    m_sim.options().controlPort = -1;
-    m_sim.options().instrument.dataDir = TestSupport::makeTempDir(QStringLiteral("jobmeasure-sim"));
-    m_sim.options().instrument.timeScale = 0.3;
-    QVERIFY(m_sim.start());
-    setIpAddress(QStringLiteral("127.0.0.1"));
-    setIpPort(m_sim.port());
-
-    AppShell::registerMetaTypes();
-    LocaleHelper::Init();
-    StringTables::Init();
-    AudioPlayer::instance()->Init();
-    DataManager::instance()->Init();
+    QVERIFY(ProductHarness::startSimulatorAndApplication(m_sim, QStringLiteral("jobmeasure")));
 
     // Screens of other areas stand in as plain panels, so that the test sees
     // which one the summary asked for.
-    ScreenMaster::setScreenFactoryOverride([](SCREEN_ID_T id, QWidget* parent) -> QWidget* {
-        if (id == JOB_LIST_SCREEN_ID || id == JOB_MEASURE_SCREEN_ID || id == SAD_PUPPY_POPUP_SCREEN_ID
-            || id == LOCK_SCREEN_ID || id == SYNC_SCREEN_ID)
-            return nullptr;
-        requestedScreens() << id;
-        DaddyPanel* standIn = new DaddyPanel(parent);
-        standIn->setObjectName(QStringLiteral("StandIn%1").arg(int(id)));
-        return standIn;
-    });
+    ProductHarness::standInOtherScreens({JOB_MEASURE_SCREEN_ID}, [](SCREEN_ID_T id) { requestedScreens() << id; });
     m_master = new ScreenMaster;
     m_master->show();
     QTRY_VERIFY_WITH_TIMEOUT(DataManager::instance()->getDataInitialized(), 20000);

@@ -21,6 +21,7 @@
 
 #include "AppShell.h"
 #include "SimServer.h"
+#include "support/ProductHarness.h"
 #include "support/TestSupport.h"
 
 #include <QFile>
@@ -85,21 +86,9 @@ private:
 
 void tst_MultilingualKeypad::initTestCase()
 {
-    const QString dataDir = TestSupport::makeTempDir(QStringLiteral("uim-keypad-sim"));
-    QVERIFY(QFile::copy(Platform::devicePath("/opt/Filter/Filter.xml"), dataDir + "/Filter.xml"));
-    m_sim.options().port = TestSupport::freeLocalPort();
-    m_sim.options().controlPort = -1;
-    m_sim.options().instrument.dataDir = dataDir;
-    m_sim.options().instrument.timeScale = 0.3;
-    QVERIFY(m_sim.start());
-    setIpAddress(QStringLiteral("127.0.0.1"));
-    setIpPort(m_sim.port());
-
-    AppShell::registerMetaTypes();
-    LocaleHelper::Init();
-    StringTables::Init();
-    AudioPlayer::instance()->Init();
-    DataManager::instance()->Init();
+    // The example filter file of the product is served as the instrument's.
+    QVERIFY(ProductHarness::startSimulatorAndApplication(m_sim, QStringLiteral("uim-keypad"), 0.3,
+                                                        ProductHarness::ExampleFilterFile));
 
     ScreenMaster::setScreenFactoryOverride([](SCREEN_ID_T id, QWidget* parent) -> QWidget* {
         if (id <= JOB_FREE_TEXT_SCREEN_ID || id == JOB_LIST_SCREEN_ID || id == SAD_PUPPY_POPUP_SCREEN_ID

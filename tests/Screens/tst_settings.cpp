@@ -36,6 +36,7 @@
 
 #include "AppShell.h"
 #include "SimServer.h"
+#include "support/ProductHarness.h"
 #include "support/TestSupport.h"
 
 #include <QDir>
@@ -98,32 +99,13 @@ private:
 
 void tst_Settings::initTestCase()
 {
-    m_sim.options().port = TestSupport::freeLocalPort();
-    m_sim.options().controlPort = -1;
-    m_sim.options().instrument.dataDir = TestSupport::makeTempDir(QStringLiteral("settings-sim"));
-    m_sim.options().instrument.timeScale = 0.2;
-    QVERIFY(m_sim.start());
-    setIpAddress(QStringLiteral("127.0.0.1"));
-    setIpPort(m_sim.port());
-
-    AppShell::registerMetaTypes();
-    LocaleHelper::Init();
-    StringTables::Init();
-    AudioPlayer::instance()->Init();
-    DataManager::instance()->Init();
+    QVERIFY(ProductHarness::startSimulatorAndApplication(m_sim, QStringLiteral("settings"), 0.2));
     SettingsWifiPage::setVerifyIntervalMs(100);
 
     // Screens of other areas stand in as plain panels.
-    ScreenMaster::setScreenFactoryOverride([this](SCREEN_ID_T id, QWidget* parent) -> QWidget* {
-        if (id == JOB_LIST_SCREEN_ID || id == CONFIG_MAIN_SCREEN_ID || id == SAD_PUPPY_POPUP_SCREEN_ID
-            || id == LOCK_SCREEN_ID || id == SYNC_SCREEN_ID || id == RESTORE_FACTORY_SETTINGS_POPUP_SCREEN_ID
-            || id == DELETE_ALL_SAMPLES_POPUP_SCREEN_ID)
-            return nullptr;
-        m_requested << id;
-        auto* standIn = new DaddyPanel(parent);
-        standIn->setObjectName(QStringLiteral("StandIn%1").arg(int(id)));
-        return standIn;
-    });
+    ProductHarness::standInOtherScreens(
+        {CONFIG_MAIN_SCREEN_ID, RESTORE_FACTORY_SETTINGS_POPUP_SCREEN_ID, DELETE_ALL_SAMPLES_POPUP_SCREEN_ID},
+        [this](SCREEN_ID_T id) { m_requested << id; });
     m_master = new ScreenMaster;
     m_master->show();
     QTRY_VERIFY_WITH_TIMEOUT(DataManager::instance()->getDataInitialized(), 20000);

@@ -24,6 +24,7 @@
 
 #include "AppShell.h"
 #include "SimServer.h"
+#include "support/ProductHarness.h"
 #include "support/TestSupport.h"
 
 #include <QElapsedTimer>
@@ -123,30 +124,12 @@ void tst_Targeting::initTestCase()
 {
     testClock().start();
     previousHandler = qInstallMessageHandler(watchMessages);
-    m_sim.options().port = TestSupport::freeLocalPort();
-    m_sim.options().controlPort = -1;
-    m_sim.options().instrument.dataDir = TestSupport::makeTempDir(QStringLiteral("targeting-sim"));
-    m_sim.options().instrument.timeScale = 0.3;
-    QVERIFY(m_sim.start());
-    setIpAddress(QStringLiteral("127.0.0.1"));
-    setIpPort(m_sim.port());
+    QVERIFY(ProductHarness::startSimulatorAndApplication(m_sim, QStringLiteral("targeting")));
 
-    AppShell::registerMetaTypes();
-    LocaleHelper::Init();
-    StringTables::Init();
-    AudioPlayer::instance()->Init();
-    DataManager::instance()->Init();
-
-    ScreenMaster::setScreenFactoryOverride([](SCREEN_ID_T id, QWidget* parent) -> QWidget* {
-        if (id == JOB_LIST_SCREEN_ID || id == SAD_PUPPY_POPUP_SCREEN_ID || id == LOCK_SCREEN_ID
-            || id == SYNC_SCREEN_ID || id == TARGETING_SCREEN_ID)
-            return nullptr;
+    ProductHarness::standInOtherScreens({TARGETING_SCREEN_ID}, [](SCREEN_ID_T id) {
         requestedScreens() << id;
         if (id == JOB_MEASURE_SCREEN_ID)
             summaryAskedAtMs = testClock().elapsed();
-        DaddyPanel* standIn = new DaddyPanel(parent);
-        standIn->setObjectName(QStringLiteral("StandIn%1").arg(int(id)));
-        return standIn;
     });
 
     m_master = new ScreenMaster;
