@@ -375,22 +375,22 @@
     <name>JobFreeTextEditScreen</name>
     <message>
         <source>Notes</source>
-        <translation type="unfinished"></translation>
+        <translation>Notizen</translation>
     </message>
 </context>
 <context>
     <name>JobKeypadScreen</name>
     <message>
         <source>OK</source>
-        <translation type="unfinished">OK</translation>
+        <translation>OK</translation>
     </message>
     <message>
         <source>ABC</source>
-        <translation type="unfinished">ABC</translation>
+        <translation>ABC</translation>
     </message>
     <message>
         <source>Special Keys</source>
-        <translation type="unfinished"></translation>
+        <translation>Sonderzeichen</translation>
     </message>
 </context>
 <context>
@@ -542,45 +542,45 @@
     <name>JobNameEditScreen</name>
     <message>
         <source>Name</source>
-        <translation type="unfinished"></translation>
+        <translation>Name</translation>
     </message>
     <message>
         <source>Job Name cannot be empty</source>
-        <translation type="unfinished"></translation>
+        <translation>Auftragsname darf nicht leer sein</translation>
     </message>
     <message>
         <source>Enter a unique job name that is not empty</source>
-        <translation type="unfinished"></translation>
+        <translation>Geben Sie einen eindeutigen, nicht leeren Auftragsnamen ein</translation>
     </message>
     <message>
         <source>Job Name Already Exists</source>
-        <translation type="unfinished"></translation>
+        <translation>Auftragsname existiert bereits</translation>
     </message>
     <message>
         <source>This job name already exists.  Please change the name to a unique name</source>
-        <translation type="unfinished"></translation>
+        <translation>Dieser Auftragsname existiert bereits. Bitte wählen Sie einen eindeutigen Namen</translation>
     </message>
 </context>
 <context>
     <name>JobTagEditScreen</name>
     <message>
         <source>Tag Name Does Not Exist</source>
-        <translation type="unfinished"></translation>
+        <translation>Merkmal existiert nicht</translation>
     </message>
     <message>
         <source>This tag name does not exist. Please change the name to an existing tag name</source>
-        <translation type="unfinished"></translation>
+        <translation>Dieses Merkmal existiert nicht. Bitte wählen Sie ein vorhandenes Merkmal</translation>
     </message>
 </context>
 <context>
     <name>Keypad</name>
     <message>
         <source>123</source>
-        <translation type="unfinished">123</translation>
+        <translation>123</translation>
     </message>
     <message>
         <source>ABC</source>
-        <translation type="unfinished">ABC</translation>
+        <translation>ABC</translation>
     </message>
 </context>
 <context>
@@ -1493,147 +1493,147 @@ Diagnose</translation>
     <name>TargetingScreen</name>
     <message>
         <source>Job</source>
-        <translation type="unfinished"></translation>
+        <translation>Auftrag</translation>
     </message>
     <message>
         <source>Press button to measure.</source>
-        <translation type="unfinished"></translation>
+        <translation>Zum Messen Taste drücken.</translation>
     </message>
     <message>
         <source>Targeting</source>
-        <translation type="unfinished"></translation>
+        <translation>Positionieren</translation>
     </message>
     <message>
         <source>Averaged 0 of SMC 0:0</source>
-        <translation type="unfinished"></translation>
+        <translation>Gemittelt 0 von SMC 0:0</translation>
     </message>
     <message>
         <source>Measure</source>
-        <translation type="unfinished">Messen</translation>
+        <translation>Messen</translation>
     </message>
     <message>
         <source>Terminate</source>
-        <translation type="unfinished"></translation>
+        <translation>Beenden</translation>
     </message>
     <message>
         <source>Online Mode</source>
-        <translation type="unfinished"></translation>
+        <translation>Online-Modus</translation>
     </message>
     <message>
         <source>Averaged %1 of SMC %2:%3</source>
-        <translation type="unfinished"></translation>
+        <translation>Gemittelt %1 von SMC %2:%3</translation>
     </message>
     <message>
         <source>OK</source>
-        <translation type="unfinished">OK</translation>
+        <translation>OK</translation>
     </message>
     <message>
         <source>Exit Online Mode?</source>
-        <translation type="unfinished"></translation>
+        <translation>Online-Modus beenden?</translation>
     </message>
     <message>
         <source>Exiting online mode will stop targeting and return to the job list.</source>
-        <translation type="unfinished"></translation>
+        <translation>Das Beenden des Online-Modus stoppt das Positionieren und kehrt zur Auftragsliste zurück.</translation>
     </message>
     <message>
         <source>Exit</source>
-        <translation type="unfinished"></translation>
+        <translation>Beenden</translation>
     </message>
     <message>
         <source>Stop Measuring?</source>
-        <translation type="unfinished"></translation>
+        <translation>Messung beenden?</translation>
     </message>
     <message>
         <source>All measured samples and this job will be permanently deleted.</source>
-        <translation type="unfinished"></translation>
+        <translation>Alle gemessenen Proben und dieser Auftrag werden endgültig gelöscht.</translation>
     </message>
     <message>
         <source>All measured samples from this job will be permanently deleted.</source>
-        <translation type="unfinished"></translation>
+        <translation>Alle gemessenen Proben dieses Auftrags werden endgültig gelöscht.</translation>
     </message>
     <message>
         <source>Warning</source>
-        <translation type="unfinished">Warnung</translation>
+        <translation>Warnung</translation>
     </message>
     <message>
         <source>Continue</source>
-        <translation type="unfinished"></translation>
+        <translation>Weiter</translation>
     </message>
     <message>
         <source>Temperature out of range.  Continue online mode until complete, or Exit online mode and return to the job list?</source>
-        <translation type="unfinished"></translation>
+        <translation>Temperatur außerhalb des Bereichs. Online-Modus bis zum Ende fortsetzen oder Online-Modus beenden und zur Auftragsliste zurückkehren?</translation>
     </message>
     <message>
         <source>Temperature out of range.  Continue job until complete, or delete job and all samples and return to the job list?</source>
-        <translation type="unfinished"></translation>
+        <translation>Temperatur außerhalb des Bereichs. Auftrag bis zum Ende fortsetzen oder Auftrag mit allen Proben löschen und zur Auftragsliste zurückkehren?</translation>
     </message>
     <message>
         <source>Temperature out of range.  Continue job until complete, or delete all samples and return to the job list?</source>
-        <translation type="unfinished"></translation>
+        <translation>Temperatur außerhalb des Bereichs. Auftrag bis zum Ende fortsetzen oder alle Proben löschen und zur Auftragsliste zurückkehren?</translation>
     </message>
     <message>
         <source>Delete</source>
-        <translation type="unfinished">Löschen</translation>
+        <translation>Löschen</translation>
     </message>
     <message>
         <source>Override Pressure Sensors?</source>
-        <translation type="unfinished"></translation>
+        <translation>Drucksensoren übergehen?</translation>
     </message>
     <message>
         <source>Not all pressure sensors are active. Press the measure button again to start a measurement, otherwise press the cancel button to return to targeting mode.</source>
-        <translation type="unfinished"></translation>
+        <translation>Nicht alle Drucksensoren sind aktiv. Drücken Sie die Messtaste erneut, um eine Messung zu starten, oder Abbrechen, um zum Positionieren zurückzukehren.</translation>
     </message>
     <message>
         <source>Cancel</source>
-        <translation type="unfinished">Abbrechen</translation>
+        <translation>Abbrechen</translation>
     </message>
     <message>
         <source>Information</source>
-        <translation type="unfinished"></translation>
+        <translation>Information</translation>
     </message>
     <message>
         <source>Not all pressure sensors are active. Please ensure all pressure sensors are active before measuring</source>
-        <translation type="unfinished"></translation>
+        <translation>Nicht alle Drucksensoren sind aktiv. Bitte stellen Sie vor dem Messen sicher, dass alle Drucksensoren aktiv sind</translation>
     </message>
     <message>
         <source>Continue Measuring?</source>
-        <translation type="unfinished"></translation>
+        <translation>Messung fortsetzen?</translation>
     </message>
     <message>
         <source>To continue with measurements, press OK</source>
-        <translation type="unfinished"></translation>
+        <translation>Zum Fortsetzen der Messungen OK drücken</translation>
     </message>
     <message>
         <source>Job Time Elapsed</source>
-        <translation type="unfinished"></translation>
+        <translation>Auftragszeit abgelaufen</translation>
     </message>
     <message>
         <source>The job wasn&apos;t completed within the allocated time</source>
-        <translation type="unfinished"></translation>
+        <translation>Der Auftrag wurde nicht in der vorgesehenen Zeit abgeschlossen</translation>
     </message>
     <message>
         <source>SMC force finished, all readings averaged for result.</source>
-        <translation type="unfinished"></translation>
+        <translation>SMC vorzeitig beendet, alle Messungen zum Ergebnis gemittelt.</translation>
     </message>
     <message>
         <source>Maximum number of SMC measurements used for this job</source>
-        <translation type="unfinished"></translation>
+        <translation>Höchstzahl der SMC-Messungen für diesen Auftrag erreicht</translation>
     </message>
     <message>
         <source>Complete</source>
-        <translation type="unfinished">Fertig</translation>
+        <translation>Abgeschlossen</translation>
     </message>
     <message>
         <source>The job has completed.  Press OK to exit online mode</source>
-        <translation type="unfinished"></translation>
+        <translation>Der Auftrag ist abgeschlossen. Drücken Sie OK, um den Online-Modus zu beenden</translation>
     </message>
     <message>
         <source>SMC force finished, all readings averaged for result.  Press OK to exit online mode</source>
-        <translation type="unfinished"></translation>
+        <translation>SMC vorzeitig beendet, alle Messungen zum Ergebnis gemittelt. Drücken Sie OK, um den Online-Modus zu beenden</translation>
     </message>
     <message>
         <source>SMC failed after maximum measurements %1, the final results are averaged.  Press OK to exit online mode</source>
-        <translation type="unfinished"></translation>
+        <translation>SMC nach der Höchstzahl von %1 Messungen fehlgeschlagen, das Ergebnis ist gemittelt. Drücken Sie OK, um den Online-Modus zu beenden</translation>
     </message>
 </context>
 <context>

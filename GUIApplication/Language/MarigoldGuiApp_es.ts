@@ -375,22 +375,22 @@
     <name>JobFreeTextEditScreen</name>
     <message>
         <source>Notes</source>
-        <translation type="unfinished"></translation>
+        <translation>Notas</translation>
     </message>
 </context>
 <context>
     <name>JobKeypadScreen</name>
     <message>
         <source>OK</source>
-        <translation type="unfinished">Aceptar</translation>
+        <translation>Aceptar</translation>
     </message>
     <message>
         <source>ABC</source>
-        <translation type="unfinished">ABC</translation>
+        <translation>ABC</translation>
     </message>
     <message>
         <source>Special Keys</source>
-        <translation type="unfinished"></translation>
+        <translation>Símbolos</translation>
     </message>
 </context>
 <context>
@@ -542,45 +542,45 @@
     <name>JobNameEditScreen</name>
     <message>
         <source>Name</source>
-        <translation type="unfinished"></translation>
+        <translation>Nombre</translation>
     </message>
     <message>
         <source>Job Name cannot be empty</source>
-        <translation type="unfinished"></translation>
+        <translation>El nombre del trabajo no puede estar vacío</translation>
     </message>
     <message>
         <source>Enter a unique job name that is not empty</source>
-        <translation type="unfinished"></translation>
+        <translation>Introduzca un nombre de trabajo único y no vacío</translation>
     </message>
     <message>
         <source>Job Name Already Exists</source>
-        <translation type="unfinished"></translation>
+        <translation>El nombre del trabajo ya existe</translation>
     </message>
     <message>
         <source>This job name already exists.  Please change the name to a unique name</source>
-        <translation type="unfinished"></translation>
+        <translation>Este nombre de trabajo ya existe. Cámbielo por un nombre único</translation>
     </message>
 </context>
 <context>
     <name>JobTagEditScreen</name>
     <message>
         <source>Tag Name Does Not Exist</source>
-        <translation type="unfinished"></translation>
+        <translation>La etiqueta no existe</translation>
     </message>
     <message>
         <source>This tag name does not exist. Please change the name to an existing tag name</source>
-        <translation type="unfinished"></translation>
+        <translation>Esta etiqueta no existe. Elija una etiqueta existente</translation>
     </message>
 </context>
 <context>
     <name>Keypad</name>
     <message>
         <source>123</source>
-        <translation type="unfinished">123</translation>
+        <translation>123</translation>
     </message>
     <message>
         <source>ABC</source>
-        <translation type="unfinished">ABC</translation>
+        <translation>ABC</translation>
     </message>
 </context>
 <context>
@@ -1493,147 +1493,147 @@ diagnóstico</translation>
     <name>TargetingScreen</name>
     <message>
         <source>Job</source>
-        <translation type="unfinished"></translation>
+        <translation>Trabajo</translation>
     </message>
     <message>
         <source>Press button to measure.</source>
-        <translation type="unfinished"></translation>
+        <translation>Pulse el botón para medir.</translation>
     </message>
     <message>
         <source>Targeting</source>
-        <translation type="unfinished"></translation>
+        <translation>Posicionamiento</translation>
     </message>
     <message>
         <source>Averaged 0 of SMC 0:0</source>
-        <translation type="unfinished"></translation>
+        <translation>Promediadas 0 de SMC 0:0</translation>
     </message>
     <message>
         <source>Measure</source>
-        <translation type="unfinished">Medir</translation>
+        <translation>Medir</translation>
     </message>
     <message>
         <source>Terminate</source>
-        <translation type="unfinished"></translation>
+        <translation>Finalizar</translation>
     </message>
     <message>
         <source>Online Mode</source>
-        <translation type="unfinished"></translation>
+        <translation>Modo en línea</translation>
     </message>
     <message>
         <source>Averaged %1 of SMC %2:%3</source>
-        <translation type="unfinished"></translation>
+        <translation>Promediadas %1 de SMC %2:%3</translation>
     </message>
     <message>
         <source>OK</source>
-        <translation type="unfinished">Aceptar</translation>
+        <translation>Aceptar</translation>
     </message>
     <message>
         <source>Exit Online Mode?</source>
-        <translation type="unfinished"></translation>
+        <translation>¿Salir del modo en línea?</translation>
     </message>
     <message>
         <source>Exiting online mode will stop targeting and return to the job list.</source>
-        <translation type="unfinished"></translation>
+        <translation>Al salir del modo en línea se detiene el posicionamiento y se vuelve a la lista de trabajos.</translation>
     </message>
     <message>
         <source>Exit</source>
-        <translation type="unfinished"></translation>
+        <translation>Salir</translation>
     </message>
     <message>
         <source>Stop Measuring?</source>
-        <translation type="unfinished"></translation>
+        <translation>¿Dejar de medir?</translation>
     </message>
     <message>
         <source>All measured samples and this job will be permanently deleted.</source>
-        <translation type="unfinished"></translation>
+        <translation>Todas las muestras medidas y este trabajo se eliminarán de forma permanente.</translation>
     </message>
     <message>
         <source>All measured samples from this job will be permanently deleted.</source>
-        <translation type="unfinished"></translation>
+        <translation>Todas las muestras medidas de este trabajo se eliminarán de forma permanente.</translation>
     </message>
     <message>
         <source>Warning</source>
-        <translation type="unfinished">Advertencia</translation>
+        <translation>Advertencia</translation>
     </message>
     <message>
         <source>Continue</source>
-        <translation type="unfinished"></translation>
+        <translation>Continuar</translation>
     </message>
     <message>
         <source>Temperature out of range.  Continue online mode until complete, or Exit online mode and return to the job list?</source>
-        <translation type="unfinished"></translation>
+        <translation>Temperatura fuera de rango. ¿Continuar en modo en línea hasta terminar, o salir del modo en línea y volver a la lista de trabajos?</translation>
     </message>
     <message>
         <source>Temperature out of range.  Continue job until complete, or delete job and all samples and return to the job list?</source>
-        <translation type="unfinished"></translation>
+        <translation>Temperatura fuera de rango. ¿Continuar el trabajo hasta terminar, o eliminar el trabajo y todas las muestras y volver a la lista?</translation>
     </message>
     <message>
         <source>Temperature out of range.  Continue job until complete, or delete all samples and return to the job list?</source>
-        <translation type="unfinished"></translation>
+        <translation>Temperatura fuera de rango. ¿Continuar el trabajo hasta terminar, o eliminar todas las muestras y volver a la lista?</translation>
     </message>
     <message>
         <source>Delete</source>
-        <translation type="unfinished">Eliminar</translation>
+        <translation>Eliminar</translation>
     </message>
     <message>
         <source>Override Pressure Sensors?</source>
-        <translation type="unfinished"></translation>
+        <translation>¿Ignorar los sensores de presión?</translation>
     </message>
     <message>
         <source>Not all pressure sensors are active. Press the measure button again to start a measurement, otherwise press the cancel button to return to targeting mode.</source>
-        <translation type="unfinished"></translation>
+        <translation>No todos los sensores de presión están activos. Pulse de nuevo el botón de medición para medir, o Cancelar para volver al posicionamiento.</translation>
     </message>
     <message>
         <source>Cancel</source>
-        <translation type="unfinished">Cancelar</translation>
+        <translation>Cancelar</translation>
     </message>
     <message>
         <source>Information</source>
-        <translation type="unfinished"></translation>
+        <translation>Información</translation>
     </message>
     <message>
         <source>Not all pressure sensors are active. Please ensure all pressure sensors are active before measuring</source>
-        <translation type="unfinished"></translation>
+        <translation>No todos los sensores de presión están activos. Asegúrese de que todos estén activos antes de medir</translation>
     </message>
     <message>
         <source>Continue Measuring?</source>
-        <translation type="unfinished"></translation>
+        <translation>¿Seguir midiendo?</translation>
     </message>
     <message>
         <source>To continue with measurements, press OK</source>
-        <translation type="unfinished"></translation>
+        <translation>Para seguir midiendo, pulse Aceptar</translation>
     </message>
     <message>
         <source>Job Time Elapsed</source>
-        <translation type="unfinished"></translation>
+        <translation>Tiempo del trabajo agotado</translation>
     </message>
     <message>
         <source>The job wasn&apos;t completed within the allocated time</source>
-        <translation type="unfinished"></translation>
+        <translation>El trabajo no se completó en el tiempo asignado</translation>
     </message>
     <message>
         <source>SMC force finished, all readings averaged for result.</source>
-        <translation type="unfinished"></translation>
+        <translation>SMC finalizado a la fuerza; todas las lecturas se promedian para el resultado.</translation>
     </message>
     <message>
         <source>Maximum number of SMC measurements used for this job</source>
-        <translation type="unfinished"></translation>
+        <translation>Se ha usado el número máximo de mediciones SMC de este trabajo</translation>
     </message>
     <message>
         <source>Complete</source>
-        <translation type="unfinished">Completados</translation>
+        <translation>Completado</translation>
     </message>
     <message>
         <source>The job has completed.  Press OK to exit online mode</source>
-        <translation type="unfinished"></translation>
+        <translation>El trabajo se ha completado. Pulse Aceptar para salir del modo en línea</translation>
     </message>
     <message>
         <source>SMC force finished, all readings averaged for result.  Press OK to exit online mode</source>
-        <translation type="unfinished"></translation>
+        <translation>SMC finalizado a la fuerza; todas las lecturas se promedian. Pulse Aceptar para salir del modo en línea</translation>
     </message>
     <message>
         <source>SMC failed after maximum measurements %1, the final results are averaged.  Press OK to exit online mode</source>
-        <translation type="unfinished"></translation>
+        <translation>SMC fallido tras el máximo de %1 mediciones; el resultado final es el promedio. Pulse Aceptar para salir del modo en línea</translation>
     </message>
 </context>
 <context>

@@ -375,22 +375,22 @@
     <name>JobFreeTextEditScreen</name>
     <message>
         <source>Notes</source>
-        <translation type="unfinished"></translation>
+        <translation>Notes</translation>
     </message>
 </context>
 <context>
     <name>JobKeypadScreen</name>
     <message>
         <source>OK</source>
-        <translation type="unfinished">OK</translation>
+        <translation>OK</translation>
     </message>
     <message>
         <source>ABC</source>
-        <translation type="unfinished">ABC</translation>
+        <translation>ABC</translation>
     </message>
     <message>
         <source>Special Keys</source>
-        <translation type="unfinished"></translation>
+        <translation>Symboles</translation>
     </message>
 </context>
 <context>
@@ -542,45 +542,45 @@
     <name>JobNameEditScreen</name>
     <message>
         <source>Name</source>
-        <translation type="unfinished"></translation>
+        <translation>Nom</translation>
     </message>
     <message>
         <source>Job Name cannot be empty</source>
-        <translation type="unfinished"></translation>
+        <translation>Le nom du travail ne peut pas être vide</translation>
     </message>
     <message>
         <source>Enter a unique job name that is not empty</source>
-        <translation type="unfinished"></translation>
+        <translation>Saisissez un nom de travail unique et non vide</translation>
     </message>
     <message>
         <source>Job Name Already Exists</source>
-        <translation type="unfinished"></translation>
+        <translation>Ce nom de travail existe déjà</translation>
     </message>
     <message>
         <source>This job name already exists.  Please change the name to a unique name</source>
-        <translation type="unfinished"></translation>
+        <translation>Ce nom de travail existe déjà. Veuillez choisir un nom unique</translation>
     </message>
 </context>
 <context>
     <name>JobTagEditScreen</name>
     <message>
         <source>Tag Name Does Not Exist</source>
-        <translation type="unfinished"></translation>
+        <translation>Cette étiquette n&apos;existe pas</translation>
     </message>
     <message>
         <source>This tag name does not exist. Please change the name to an existing tag name</source>
-        <translation type="unfinished"></translation>
+        <translation>Cette étiquette n&apos;existe pas. Veuillez choisir une étiquette existante</translation>
     </message>
 </context>
 <context>
     <name>Keypad</name>
     <message>
         <source>123</source>
-        <translation type="unfinished">123</translation>
+        <translation>123</translation>
     </message>
     <message>
         <source>ABC</source>
-        <translation type="unfinished">ABC</translation>
+        <translation>ABC</translation>
     </message>
 </context>
 <context>
@@ -1493,147 +1493,147 @@ diagnostic</translation>
     <name>TargetingScreen</name>
     <message>
         <source>Job</source>
-        <translation type="unfinished"></translation>
+        <translation>Travail</translation>
     </message>
     <message>
         <source>Press button to measure.</source>
-        <translation type="unfinished"></translation>
+        <translation>Appuyez sur le bouton pour mesurer.</translation>
     </message>
     <message>
         <source>Targeting</source>
-        <translation type="unfinished"></translation>
+        <translation>Visée</translation>
     </message>
     <message>
         <source>Averaged 0 of SMC 0:0</source>
-        <translation type="unfinished"></translation>
+        <translation>Moyennées 0 sur SMC 0:0</translation>
     </message>
     <message>
         <source>Measure</source>
-        <translation type="unfinished">Mesurer</translation>
+        <translation>Mesurer</translation>
     </message>
     <message>
         <source>Terminate</source>
-        <translation type="unfinished"></translation>
+        <translation>Terminer</translation>
     </message>
     <message>
         <source>Online Mode</source>
-        <translation type="unfinished"></translation>
+        <translation>Mode en ligne</translation>
     </message>
     <message>
         <source>Averaged %1 of SMC %2:%3</source>
-        <translation type="unfinished"></translation>
+        <translation>Moyennées %1 sur SMC %2:%3</translation>
     </message>
     <message>
         <source>OK</source>
-        <translation type="unfinished">OK</translation>
+        <translation>OK</translation>
     </message>
     <message>
         <source>Exit Online Mode?</source>
-        <translation type="unfinished"></translation>
+        <translation>Quitter le mode en ligne ?</translation>
     </message>
     <message>
         <source>Exiting online mode will stop targeting and return to the job list.</source>
-        <translation type="unfinished"></translation>
+        <translation>Quitter le mode en ligne arrête la visée et revient à la liste des travaux.</translation>
     </message>
     <message>
         <source>Exit</source>
-        <translation type="unfinished"></translation>
+        <translation>Quitter</translation>
     </message>
     <message>
         <source>Stop Measuring?</source>
-        <translation type="unfinished"></translation>
+        <translation>Arrêter la mesure ?</translation>
     </message>
     <message>
         <source>All measured samples and this job will be permanently deleted.</source>
-        <translation type="unfinished"></translation>
+        <translation>Tous les échantillons mesurés et ce travail seront définitivement supprimés.</translation>
     </message>
     <message>
         <source>All measured samples from this job will be permanently deleted.</source>
-        <translation type="unfinished"></translation>
+        <translation>Tous les échantillons mesurés de ce travail seront définitivement supprimés.</translation>
     </message>
     <message>
         <source>Warning</source>
-        <translation type="unfinished">Avertissement</translation>
+        <translation>Avertissement</translation>
     </message>
     <message>
         <source>Continue</source>
-        <translation type="unfinished"></translation>
+        <translation>Continuer</translation>
     </message>
     <message>
         <source>Temperature out of range.  Continue online mode until complete, or Exit online mode and return to the job list?</source>
-        <translation type="unfinished"></translation>
+        <translation>Température hors plage. Continuer en mode en ligne jusqu&apos;à la fin, ou quitter le mode en ligne et revenir à la liste des travaux ?</translation>
     </message>
     <message>
         <source>Temperature out of range.  Continue job until complete, or delete job and all samples and return to the job list?</source>
-        <translation type="unfinished"></translation>
+        <translation>Température hors plage. Continuer le travail jusqu&apos;à la fin, ou supprimer le travail et tous les échantillons et revenir à la liste ?</translation>
     </message>
     <message>
         <source>Temperature out of range.  Continue job until complete, or delete all samples and return to the job list?</source>
-        <translation type="unfinished"></translation>
+        <translation>Température hors plage. Continuer le travail jusqu&apos;à la fin, ou supprimer tous les échantillons et revenir à la liste ?</translation>
     </message>
     <message>
         <source>Delete</source>
-        <translation type="unfinished">Supprimer</translation>
+        <translation>Supprimer</translation>
     </message>
     <message>
         <source>Override Pressure Sensors?</source>
-        <translation type="unfinished"></translation>
+        <translation>Ignorer les capteurs de pression ?</translation>
     </message>
     <message>
         <source>Not all pressure sensors are active. Press the measure button again to start a measurement, otherwise press the cancel button to return to targeting mode.</source>
-        <translation type="unfinished"></translation>
+        <translation>Tous les capteurs de pression ne sont pas actifs. Appuyez à nouveau sur le bouton de mesure pour mesurer, ou sur Annuler pour revenir à la visée.</translation>
     </message>
     <message>
         <source>Cancel</source>
-        <translation type="unfinished">Annuler</translation>
+        <translation>Annuler</translation>
     </message>
     <message>
         <source>Information</source>
-        <translation type="unfinished"></translation>
+        <translation>Information</translation>
     </message>
     <message>
         <source>Not all pressure sensors are active. Please ensure all pressure sensors are active before measuring</source>
-        <translation type="unfinished"></translation>
+        <translation>Tous les capteurs de pression ne sont pas actifs. Assurez-vous qu&apos;ils le sont tous avant de mesurer</translation>
     </message>
     <message>
         <source>Continue Measuring?</source>
-        <translation type="unfinished"></translation>
+        <translation>Continuer la mesure ?</translation>
     </message>
     <message>
         <source>To continue with measurements, press OK</source>
-        <translation type="unfinished"></translation>
+        <translation>Pour continuer les mesures, appuyez sur OK</translation>
     </message>
     <message>
         <source>Job Time Elapsed</source>
-        <translation type="unfinished"></translation>
+        <translation>Temps du travail écoulé</translation>
     </message>
     <message>
         <source>The job wasn&apos;t completed within the allocated time</source>
-        <translation type="unfinished"></translation>
+        <translation>Le travail n&apos;a pas été terminé dans le temps imparti</translation>
     </message>
     <message>
         <source>SMC force finished, all readings averaged for result.</source>
-        <translation type="unfinished"></translation>
+        <translation>SMC terminé de force, toutes les mesures sont moyennées pour le résultat.</translation>
     </message>
     <message>
         <source>Maximum number of SMC measurements used for this job</source>
-        <translation type="unfinished"></translation>
+        <translation>Nombre maximal de mesures SMC atteint pour ce travail</translation>
     </message>
     <message>
         <source>Complete</source>
-        <translation type="unfinished">Terminés</translation>
+        <translation>Terminé</translation>
     </message>
     <message>
         <source>The job has completed.  Press OK to exit online mode</source>
-        <translation type="unfinished"></translation>
+        <translation>Le travail est terminé. Appuyez sur OK pour quitter le mode en ligne</translation>
     </message>
     <message>
         <source>SMC force finished, all readings averaged for result.  Press OK to exit online mode</source>
-        <translation type="unfinished"></translation>
+        <translation>SMC terminé de force, toutes les mesures sont moyennées. Appuyez sur OK pour quitter le mode en ligne</translation>
     </message>
     <message>
         <source>SMC failed after maximum measurements %1, the final results are averaged.  Press OK to exit online mode</source>
-        <translation type="unfinished"></translation>
+        <translation>SMC en échec après le maximum de %1 mesures, le résultat final est moyenné. Appuyez sur OK pour quitter le mode en ligne</translation>
     </message>
 </context>
 <context>

@@ -375,22 +375,22 @@
     <name>JobFreeTextEditScreen</name>
     <message>
         <source>Notes</source>
-        <translation type="unfinished"></translation>
+        <translation>Note</translation>
     </message>
 </context>
 <context>
     <name>JobKeypadScreen</name>
     <message>
         <source>OK</source>
-        <translation type="unfinished">OK</translation>
+        <translation>OK</translation>
     </message>
     <message>
         <source>ABC</source>
-        <translation type="unfinished">ABC</translation>
+        <translation>ABC</translation>
     </message>
     <message>
         <source>Special Keys</source>
-        <translation type="unfinished"></translation>
+        <translation>Simboli</translation>
     </message>
 </context>
 <context>
@@ -542,45 +542,45 @@
     <name>JobNameEditScreen</name>
     <message>
         <source>Name</source>
-        <translation type="unfinished"></translation>
+        <translation>Nome</translation>
     </message>
     <message>
         <source>Job Name cannot be empty</source>
-        <translation type="unfinished"></translation>
+        <translation>Il nome del lavoro non può essere vuoto</translation>
     </message>
     <message>
         <source>Enter a unique job name that is not empty</source>
-        <translation type="unfinished"></translation>
+        <translation>Inserire un nome di lavoro univoco e non vuoto</translation>
     </message>
     <message>
         <source>Job Name Already Exists</source>
-        <translation type="unfinished"></translation>
+        <translation>Nome del lavoro già esistente</translation>
     </message>
     <message>
         <source>This job name already exists.  Please change the name to a unique name</source>
-        <translation type="unfinished"></translation>
+        <translation>Questo nome di lavoro esiste già. Sceglierne uno univoco</translation>
     </message>
 </context>
 <context>
     <name>JobTagEditScreen</name>
     <message>
         <source>Tag Name Does Not Exist</source>
-        <translation type="unfinished"></translation>
+        <translation>Etichetta inesistente</translation>
     </message>
     <message>
         <source>This tag name does not exist. Please change the name to an existing tag name</source>
-        <translation type="unfinished"></translation>
+        <translation>Questa etichetta non esiste. Sceglierne una esistente</translation>
     </message>
 </context>
 <context>
     <name>Keypad</name>
     <message>
         <source>123</source>
-        <translation type="unfinished">123</translation>
+        <translation>123</translation>
     </message>
     <message>
         <source>ABC</source>
-        <translation type="unfinished">ABC</translation>
+        <translation>ABC</translation>
     </message>
 </context>
 <context>
@@ -1493,147 +1493,147 @@ diagnostica</translation>
     <name>TargetingScreen</name>
     <message>
         <source>Job</source>
-        <translation type="unfinished"></translation>
+        <translation>Lavoro</translation>
     </message>
     <message>
         <source>Press button to measure.</source>
-        <translation type="unfinished"></translation>
+        <translation>Premere il pulsante per misurare.</translation>
     </message>
     <message>
         <source>Targeting</source>
-        <translation type="unfinished"></translation>
+        <translation>Puntamento</translation>
     </message>
     <message>
         <source>Averaged 0 of SMC 0:0</source>
-        <translation type="unfinished"></translation>
+        <translation>Mediate 0 di SMC 0:0</translation>
     </message>
     <message>
         <source>Measure</source>
-        <translation type="unfinished">Misura</translation>
+        <translation>Misura</translation>
     </message>
     <message>
         <source>Terminate</source>
-        <translation type="unfinished"></translation>
+        <translation>Termina</translation>
     </message>
     <message>
         <source>Online Mode</source>
-        <translation type="unfinished"></translation>
+        <translation>Modalità online</translation>
     </message>
     <message>
         <source>Averaged %1 of SMC %2:%3</source>
-        <translation type="unfinished"></translation>
+        <translation>Mediate %1 di SMC %2:%3</translation>
     </message>
     <message>
         <source>OK</source>
-        <translation type="unfinished">OK</translation>
+        <translation>OK</translation>
     </message>
     <message>
         <source>Exit Online Mode?</source>
-        <translation type="unfinished"></translation>
+        <translation>Uscire dalla modalità online?</translation>
     </message>
     <message>
         <source>Exiting online mode will stop targeting and return to the job list.</source>
-        <translation type="unfinished"></translation>
+        <translation>L&apos;uscita dalla modalità online interrompe il puntamento e torna all&apos;elenco dei lavori.</translation>
     </message>
     <message>
         <source>Exit</source>
-        <translation type="unfinished"></translation>
+        <translation>Esci</translation>
     </message>
     <message>
         <source>Stop Measuring?</source>
-        <translation type="unfinished"></translation>
+        <translation>Interrompere la misura?</translation>
     </message>
     <message>
         <source>All measured samples and this job will be permanently deleted.</source>
-        <translation type="unfinished"></translation>
+        <translation>Tutti i campioni misurati e questo lavoro verranno eliminati definitivamente.</translation>
     </message>
     <message>
         <source>All measured samples from this job will be permanently deleted.</source>
-        <translation type="unfinished"></translation>
+        <translation>Tutti i campioni misurati di questo lavoro verranno eliminati definitivamente.</translation>
     </message>
     <message>
         <source>Warning</source>
-        <translation type="unfinished">Avviso</translation>
+        <translation>Avviso</translation>
     </message>
     <message>
         <source>Continue</source>
-        <translation type="unfinished"></translation>
+        <translation>Continua</translation>
     </message>
     <message>
         <source>Temperature out of range.  Continue online mode until complete, or Exit online mode and return to the job list?</source>
-        <translation type="unfinished"></translation>
+        <translation>Temperatura fuori intervallo. Continuare in modalità online fino al termine o uscire e tornare all&apos;elenco dei lavori?</translation>
     </message>
     <message>
         <source>Temperature out of range.  Continue job until complete, or delete job and all samples and return to the job list?</source>
-        <translation type="unfinished"></translation>
+        <translation>Temperatura fuori intervallo. Continuare il lavoro fino al termine o eliminare lavoro e campioni e tornare all&apos;elenco?</translation>
     </message>
     <message>
         <source>Temperature out of range.  Continue job until complete, or delete all samples and return to the job list?</source>
-        <translation type="unfinished"></translation>
+        <translation>Temperatura fuori intervallo. Continuare il lavoro fino al termine o eliminare tutti i campioni e tornare all&apos;elenco?</translation>
     </message>
     <message>
         <source>Delete</source>
-        <translation type="unfinished">Elimina</translation>
+        <translation>Elimina</translation>
     </message>
     <message>
         <source>Override Pressure Sensors?</source>
-        <translation type="unfinished"></translation>
+        <translation>Ignorare i sensori di pressione?</translation>
     </message>
     <message>
         <source>Not all pressure sensors are active. Press the measure button again to start a measurement, otherwise press the cancel button to return to targeting mode.</source>
-        <translation type="unfinished"></translation>
+        <translation>Non tutti i sensori di pressione sono attivi. Premere di nuovo il pulsante di misura per misurare, oppure Annulla per tornare al puntamento.</translation>
     </message>
     <message>
         <source>Cancel</source>
-        <translation type="unfinished">Annulla</translation>
+        <translation>Annulla</translation>
     </message>
     <message>
         <source>Information</source>
-        <translation type="unfinished"></translation>
+        <translation>Informazioni</translation>
     </message>
     <message>
         <source>Not all pressure sensors are active. Please ensure all pressure sensors are active before measuring</source>
-        <translation type="unfinished"></translation>
+        <translation>Non tutti i sensori di pressione sono attivi. Assicurarsi che lo siano tutti prima di misurare</translation>
     </message>
     <message>
         <source>Continue Measuring?</source>
-        <translation type="unfinished"></translation>
+        <translation>Continuare a misurare?</translation>
     </message>
     <message>
         <source>To continue with measurements, press OK</source>
-        <translation type="unfinished"></translation>
+        <translation>Per continuare le misure, premere OK</translation>
     </message>
     <message>
         <source>Job Time Elapsed</source>
-        <translation type="unfinished"></translation>
+        <translation>Tempo del lavoro scaduto</translation>
     </message>
     <message>
         <source>The job wasn&apos;t completed within the allocated time</source>
-        <translation type="unfinished"></translation>
+        <translation>Il lavoro non è stato completato nel tempo previsto</translation>
     </message>
     <message>
         <source>SMC force finished, all readings averaged for result.</source>
-        <translation type="unfinished"></translation>
+        <translation>SMC terminato forzatamente, tutte le letture mediate per il risultato.</translation>
     </message>
     <message>
         <source>Maximum number of SMC measurements used for this job</source>
-        <translation type="unfinished"></translation>
+        <translation>Raggiunto il numero massimo di misure SMC per questo lavoro</translation>
     </message>
     <message>
         <source>Complete</source>
-        <translation type="unfinished">Completati</translation>
+        <translation>Completato</translation>
     </message>
     <message>
         <source>The job has completed.  Press OK to exit online mode</source>
-        <translation type="unfinished"></translation>
+        <translation>Il lavoro è completato. Premere OK per uscire dalla modalità online</translation>
     </message>
     <message>
         <source>SMC force finished, all readings averaged for result.  Press OK to exit online mode</source>
-        <translation type="unfinished"></translation>
+        <translation>SMC terminato forzatamente, tutte le letture mediate. Premere OK per uscire dalla modalità online</translation>
     </message>
     <message>
         <source>SMC failed after maximum measurements %1, the final results are averaged.  Press OK to exit online mode</source>
-        <translation type="unfinished"></translation>
+        <translation>SMC non riuscito dopo il massimo di %1 misure, il risultato finale è mediato. Premere OK per uscire dalla modalità online</translation>
     </message>
 </context>
 <context>
