@@ -1497,7 +1497,7 @@ diagnostic</translation>
     </message>
     <message>
         <source>Press button to measure.</source>
-        <translation>Appuyez sur le bouton pour mesurer.</translation>
+        <translation>Appuyez sur Mesurer.</translation>
     </message>
     <message>
         <source>Targeting</source>
