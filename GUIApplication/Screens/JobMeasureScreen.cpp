@@ -19,23 +19,14 @@
 #include "Widgets/SpinnyCircle.h"
 #include "Widgets/WebSyncButton.h"
 
-#include <QApplication>
+#include "Widgets/Theme.h"
+
 #include <QDebug>
 #include <QEvent>
 #include <QKeyEvent>
 #include <QTimer>
 
 namespace {
-
-// Fonts by pixel size in the language's family: a style sheet font would
-// keep the fitting labels from shrinking long texts.
-QFont pixelFont(int pixels, bool bold = false)
-{
-    QFont font = QApplication::font();
-    font.setPixelSize(pixels);
-    font.setBold(bold);
-    return font;
-}
 
 // The tag screens by tag state, with the filter file and without.
 const SCREEN_ID_T kTagScreens[NUM_TAG_STATES] = {JOB_TAGS_1_SCREEN_ID, JOB_TAGS_2_SCREEN_ID,
@@ -56,9 +47,9 @@ JobMeasureScreen::JobMeasureScreen(QWidget* parent)
     , m_WebSyncButtonIndex(-1)
 {
     ui->setupUi(this);
-    ui->labelHeader->setFont(pixelFont(22, true));
-    ui->labelDeleteText->setFont(pixelFont(11));
-    ui->labelSaveText->setFont(pixelFont(11));
+    ui->labelHeader->setFont(Theme::pixelFont(22, true));
+    ui->labelDeleteText->setFont(Theme::pixelFont(11));
+    ui->labelSaveText->setFont(Theme::pixelFont(11));
     setObjectName(QStringLiteral("JobMeasureScreen"));
     // The captions sit on the title buttons; a tap on them is a tap on the button.
     ui->labelDeleteText->setAttribute(Qt::WA_TransparentForMouseEvents);

@@ -7,28 +7,15 @@
 #include "SharedSystem/UserParams.h"
 #include "Widgets/WebSyncWidget.h"
 
-#include <QApplication>
+#include "Widgets/Theme.h"
 
-namespace {
-
-// Fonts by pixel size in the language's family: a style sheet font would
-// keep the fitting labels from shrinking long texts.
-QFont pixelFont(int pixels, bool bold = false)
-{
-    QFont font = QApplication::font();
-    font.setPixelSize(pixels);
-    font.setBold(bold);
-    return font;
-}
-
-} // namespace
 
 JobMeasureListingHeader::JobMeasureListingHeader(const QString& text, QWidget* parent)
     : QWidget(parent)
     , ui(new Ui::JobMeasureListingHeader)
 {
     ui->setupUi(this);
-    ui->labelLeftText->setFont(pixelFont(13, true));
+    ui->labelLeftText->setFont(Theme::pixelFont(13, true));
     ui->labelLeftText->setAutoSize(true);
     ui->labelLeftText->setText(text);
     ui->webSyncWidget->hide();

@@ -4,21 +4,8 @@
 
 #include "Widgets/KLabel.h"
 
-#include <QApplication>
+#include "Widgets/Theme.h"
 
-namespace {
-
-// Fonts by pixel size in the language's family: a style sheet font would
-// keep the fitting labels from shrinking long texts.
-QFont pixelFont(int pixels, bool bold = false)
-{
-    QFont font = QApplication::font();
-    font.setPixelSize(pixels);
-    font.setBold(bold);
-    return font;
-}
-
-} // namespace
 
 JobSummaryEditSelectionItem::JobSummaryEditSelectionItem(const QString& description, const QString& value,
                                                          QWidget* parent, bool editable)
@@ -26,8 +13,8 @@ JobSummaryEditSelectionItem::JobSummaryEditSelectionItem(const QString& descript
     , ui(new Ui::JobSummaryEditSelectionItem)
 {
     ui->setupUi(this);
-    ui->labelDescription->setFont(pixelFont(13));
-    ui->labelValue->setFont(pixelFont(18, true));
+    ui->labelDescription->setFont(Theme::pixelFont(13));
+    ui->labelValue->setFont(Theme::pixelFont(18, true));
     // The labels lie over the button; touches must reach the button.
     for (QWidget* child : {static_cast<QWidget*>(ui->labelDescription), static_cast<QWidget*>(ui->labelValue),
                            static_cast<QWidget*>(ui->labelEditMarker)})

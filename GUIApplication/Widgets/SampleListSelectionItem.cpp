@@ -8,19 +8,10 @@
 #include "Widgets/KLabel.h"
 #include "Widgets/SampleColorStrip.h"
 
-#include <QApplication>
+#include "Widgets/Theme.h"
+
 
 namespace {
-
-// Fonts by pixel size in the language's family: a style sheet font would
-// keep the fitting labels from shrinking long texts.
-QFont pixelFont(int pixels, bool bold = false)
-{
-    QFont font = QApplication::font();
-    font.setPixelSize(pixels);
-    font.setBold(bold);
-    return font;
-}
 
 const int kStripSpacing = 2;
 const int kMargin = 16;
@@ -34,8 +25,8 @@ SampleListSelectionItem::SampleListSelectionItem(int sampleIndex, QWidget* paren
     , m_clickable(clickable)
 {
     ui->setupUi(this);
-    ui->labelNumber->setFont(pixelFont(14, true));
-    ui->labelDateTime->setFont(pixelFont(15));
+    ui->labelNumber->setFont(Theme::pixelFont(14, true));
+    ui->labelDateTime->setFont(Theme::pixelFont(15));
     setFocusPolicy(Qt::NoFocus);
     setMouseTracking(false);
     // The fields lie over the button; touches must reach the button.

@@ -2,29 +2,16 @@
 
 #include "ui_SampleListSelectionItemComplete.h"
 
-#include <QApplication>
+#include "Widgets/Theme.h"
+
 #include <QEvent>
-
-namespace {
-
-// Fonts by pixel size in the language's family: a style sheet font would
-// keep the fitting labels from shrinking long texts.
-QFont pixelFont(int pixels, bool bold = false)
-{
-    QFont font = QApplication::font();
-    font.setPixelSize(pixels);
-    font.setBold(bold);
-    return font;
-}
-
-} // namespace
 
 SampleListSelectionItemComplete::SampleListSelectionItemComplete(QWidget* parent)
     : QWidget(parent)
     , ui(new Ui::SampleListSelectionItemComplete)
 {
     ui->setupUi(this);
-    ui->labelMessage->setFont(pixelFont(15));
+    ui->labelMessage->setFont(Theme::pixelFont(15));
     ui->labelMessage->setAutoSize(true);
 }
 

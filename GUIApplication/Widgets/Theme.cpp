@@ -19,6 +19,14 @@ QFont font(int pointSize, bool bold)
     return f;
 }
 
+QFont pixelFont(int pixels, bool bold)
+{
+    QFont f;
+    f.setPixelSize(pixels);
+    f.setBold(bold);
+    return f;
+}
+
 QString css(const QColor& colour)
 {
     return QString("rgb(%1, %2, %3)").arg(colour.red()).arg(colour.green()).arg(colour.blue());

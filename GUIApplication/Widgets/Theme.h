@@ -65,6 +65,8 @@ const int FontButton = 13;
 const int FontSmall = 10;
 
 QFont font(int pointSize, bool bold = false);
+// The same by pixel size, for rows drawn to the pixel.
+QFont pixelFont(int pixels, bool bold = false);
 
 // "rgb(r, g, b)" for style sheets.
 QString css(const QColor& colour);
