@@ -88,7 +88,7 @@ JobNameEditScreen::JobNameEditScreen(QWidget* parent)
     : JobKeypadScreen(parent)
 {
     setObjectName("JobNameEditScreen");
-    setTitle(tr("Name"));
+    setTitle([] { return tr("Name"); });
     setChangeColor(true);
     setEntryLength(20);
     QPlainTextEdit* field = getTextEditPointer();
@@ -148,7 +148,7 @@ JobTagFreeEditScreen::JobTagFreeEditScreen(TAG_STATES_T state, QWidget* parent)
 {
     setObjectName("JobTagFreeEditScreen");
     DataManager* data = DataManager::instance();
-    setTitle(data->getTagStateName(state));
+    setTitle([state] { return DataManager::instance()->getTagStateName(state); });
     setChangeColor(false);
     setEntryLength(40);
     useTallField();
@@ -184,7 +184,7 @@ JobFreeTextEditScreen::JobFreeTextEditScreen(QWidget* parent)
     : JobNameEditScreen(parent)
 {
     setObjectName("JobFreeTextEditScreen");
-    setTitle(tr("Notes"));
+    setTitle([] { return tr("Notes"); });
     setChangeColor(false);
     setEntryLength(40);
     useTallField();
@@ -248,7 +248,7 @@ JobTagEditScreen::JobTagEditScreen(TAG_STATES_T state, QWidget* parent)
     connect(m_pBtnMiddle, &QPushButton::clicked, this, &JobTagEditScreen::onBtnMiddleClicked);
     connect(m_pBtnMore, &QPushButton::clicked, this, &JobTagEditScreen::onBtnMoreClicked);
 
-    setTitle(data->getTagStateName(state));
+    setTitle([state] { return DataManager::instance()->getTagStateName(state); });
     QPlainTextEdit* field = getTextEditPointer();
     field->setPlainText(data->getActiveJobObject().getTagData(state).defaultName());
     cursorToEnd(field);

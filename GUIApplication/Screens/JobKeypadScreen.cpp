@@ -305,6 +305,12 @@ void JobKeypadScreen::setTitle(const QString& title)
     ui->TxtTitle->QLabel::setFont(font);
 }
 
+void JobKeypadScreen::setTitle(std::function<QString()> title)
+{
+    m_titleSource = std::move(title);
+    setTitle(m_titleSource ? m_titleSource() : QString());
+}
+
 void JobKeypadScreen::on_BtnBack_clicked()
 {
     playSoundButtonClick();
@@ -654,8 +660,8 @@ void JobKeypadScreen::changeEvent(QEvent* event)
 
 void JobKeypadScreen::retranslate()
 {
-    const QString title = ui->TxtTitle->defaultText();
+    const QString title = m_titleSource ? QString() : ui->TxtTitle->defaultText();
     ui->retranslateUi(this);
-    setTitle(title);
+    setTitle(m_titleSource ? m_titleSource() : title);
     updateSpecialText();
 }

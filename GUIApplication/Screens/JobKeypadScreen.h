@@ -158,6 +158,8 @@ public:
 
 public slots:
     virtual void setTitle(const QString& title);
+    // A title in the screen's language, asked again when the language changes.
+    void setTitle(std::function<QString()> title);
     virtual void on_BtnBack_clicked();
     virtual void on_BtnNext_clicked();
     virtual void onKeyClicked(const QString& text);
@@ -224,6 +226,7 @@ private:
     void updateSpecialText();
 
     std::unique_ptr<KeypadComposer> m_composer;
+    std::function<QString()> m_titleSource;
 
     bool m_multilingual = false;
     int m_functionRowY = 0;

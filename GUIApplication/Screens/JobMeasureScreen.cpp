@@ -194,7 +194,7 @@ void JobMeasureScreen::onRefreshSampleList()
     }
 
     m_pWebSyncButton = new WebSyncButton;
-    m_pWebSyncButton->SetText(tr("Send Job To Server"));
+    m_pWebSyncButton->SetText([] { return tr("Send Job To Server"); });
     connect(m_pWebSyncButton, &QPushButton::clicked, this, &JobMeasureScreen::onWebSync);
     ui->SampleList->addWidget(m_pWebSyncButton);
     m_WebSyncButtonIndex = ui->SampleList->count() - 1;

@@ -10,6 +10,7 @@
 #include "Widgets/SampleTexturePage.h"
 #include "Widgets/Theme.h"
 
+#include <QEvent>
 #include <QSignalMapper>
 #include <QStyle>
 
@@ -102,6 +103,18 @@ void SampleDetailsPageContainer::removeButton(int index)
     m_pageButtons.erase(m_pageButtons.begin() + index);
 }
 
+void SampleDetailsPageContainer::changeEvent(QEvent* event)
+{
+    if (event->type() == QEvent::LanguageChange) {
+        // Angle names such as "Diffuse" come from the string tables, which
+        // the language change has already reread.
+        m_buttonStrings = translatedButtonStrings();
+        for (size_t i = 0; i < m_pageButtons.size() && int(i) < m_buttonStrings.size(); ++i)
+            m_pageButtons[i]->setText(m_buttonStrings.at(int(i)).trimmed());
+    }
+    VerticalPageContainer::changeEvent(event);
+}
+
 void SampleDetailsPageContainer::onSelectPageWithSlide(int index)
 {
     if (index < 0 || index >= getNumberOfPages())
@@ -143,9 +156,22 @@ void SampleDetailsPageContainerDNumber::appendPage(REFL_ANGLE_T angle)
     page->set_C_Star(labch.c);
     page->set_h_Star(labch.h);
     m_buttonAngles.push_back(angle);
-    // The blanks leave room for the colour patch on the button.
-    m_buttonStrings.append(QStringLiteral("          %1").arg(getStringFromList(angle, ANGLE_TABLE)));
+    m_buttonStrings.append(buttonString(angle));
     SampleDetailsPageContainer::appendPage(page);
+}
+
+QString SampleDetailsPageContainerDNumber::buttonString(REFL_ANGLE_T angle)
+{
+    // The blanks leave room for the colour patch on the button.
+    return QStringLiteral("          %1").arg(getStringFromList(angle, ANGLE_TABLE));
+}
+
+QStringList SampleDetailsPageContainerDNumber::translatedButtonStrings() const
+{
+    QStringList strings;
+    for (REFL_ANGLE_T angle : m_buttonAngles)
+        strings << buttonString(angle);
+    return strings;
 }
 
 void SampleDetailsPageContainerDNumber::drawButtons()
@@ -223,6 +249,15 @@ void SampleDetailsPageContainerTexture::appendPage(IMAGE_ANGLE_T angle)
 {
     auto* page = new SampleTexturePage(angle, this);
     page->setObjectName(QStringLiteral("texturePage%1").arg(int(angle)));
+    m_imageAngles.push_back(angle);
     m_buttonStrings.append(getStringFromList(angle, IMAGE_ANGLE_TABLE));
     SampleDetailsPageContainer::appendPage(page);
+}
+
+QStringList SampleDetailsPageContainerTexture::translatedButtonStrings() const
+{
+    QStringList strings;
+    for (IMAGE_ANGLE_T angle : m_imageAngles)
+        strings << getStringFromList(angle, IMAGE_ANGLE_TABLE);
+    return strings;
 }

@@ -38,6 +38,9 @@ protected:
     // Places a page right of the buttons, as high as the container.
     void fitPage(QWidget* page);
     int buttonHeight() const;
+    void changeEvent(QEvent* event) override;
+    // The button texts in the language now loaded, in page order.
+    virtual QStringList translatedButtonStrings() const { return m_buttonStrings; }
 
     std::vector<FlickButton*> m_pageButtons;
     QStringList m_buttonStrings;
@@ -63,7 +66,12 @@ public slots:
     void removeAllColorPatches();
     void updatePage() override;
 
+protected:
+    QStringList translatedButtonStrings() const override;
+
 private:
+    static QString buttonString(REFL_ANGLE_T angle);
+
     std::vector<REFL_ANGLE_T> m_buttonAngles;
     std::vector<ColorPatch*> m_colorPatches;
 };
@@ -91,6 +99,12 @@ public:
 
     using SampleDetailsPageContainer::appendPage;
     void appendPage(IMAGE_ANGLE_T angle);
+
+protected:
+    QStringList translatedButtonStrings() const override;
+
+private:
+    std::vector<IMAGE_ANGLE_T> m_imageAngles;
 };
 
 #endif // SAMPLEDETAILSPAGECONTAINER_H

@@ -23,6 +23,12 @@ void WebSyncButton::SetText(QString text)
     ui->labelText->setText(text);
 }
 
+void WebSyncButton::SetText(std::function<QString()> text)
+{
+    m_textSource = std::move(text);
+    ui->labelText->setText(m_textSource ? m_textSource() : QString());
+}
+
 QString WebSyncButton::text() const
 {
     return ui->labelText->text();
@@ -30,7 +36,10 @@ QString WebSyncButton::text() const
 
 void WebSyncButton::changeEvent(QEvent* event)
 {
-    if (event->type() == QEvent::LanguageChange)
+    if (event->type() == QEvent::LanguageChange) {
         ui->retranslateUi(this);
+        if (m_textSource)
+            ui->labelText->setText(m_textSource());
+    }
     FlickButton::changeEvent(event);
 }

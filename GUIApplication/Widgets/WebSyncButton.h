@@ -3,6 +3,8 @@
 
 #include "Widgets/FlickButton.h"
 
+#include <functional>
+
 namespace Ui {
 class WebSyncButton;
 }
@@ -16,6 +18,9 @@ public:
     ~WebSyncButton() override;
 
     void SetText(QString text);
+    // A text of the owner's own, asked again when the language changes
+    // (the form's text is the job list's).
+    void SetText(std::function<QString()> text);
     QString text() const;
 
 protected:
@@ -23,6 +28,7 @@ protected:
 
 private:
     Ui::WebSyncButton* ui;
+    std::function<QString()> m_textSource;
 };
 
 #endif // WEBSYNCBUTTON_H

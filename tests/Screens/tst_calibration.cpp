@@ -80,10 +80,8 @@ void tst_Calibration::initTestCase()
     QVERIFY(ProductHarness::startSimulatorAndApplication(m_sim, QStringLiteral("calibration")));
 
     m_master = new ScreenMaster;
-    m_master->show();
-    QTRY_VERIFY_WITH_TIMEOUT(DataManager::instance()->getDataInitialized(), 20000);
     // The start-up sends the stack home once the list stands: not under a test.
-    QTRY_VERIFY_WITH_TIMEOUT(m_master->findChild<JobListScreen*>()->isReady(), 10000);
+    QVERIFY(ProductHarness::showHome(m_master));
     waitIdle();
 }
 

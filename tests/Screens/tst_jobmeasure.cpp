@@ -109,13 +109,7 @@ void tst_JobMeasure::initTestCase()
     // which one the summary asked for.
     ProductHarness::standInOtherScreens({JOB_MEASURE_SCREEN_ID}, [](SCREEN_ID_T id) { requestedScreens() << id; });
     m_master = new ScreenMaster;
-    m_master->show();
-    QTRY_VERIFY_WITH_TIMEOUT(DataManager::instance()->getDataInitialized(), 20000);
-    // The home screen settles after the link's start-up, which goes home.
-    JobListScreen* home = m_master->findChild<JobListScreen*>();
-    QVERIFY(home);
-    QTRY_VERIFY_WITH_TIMEOUT(home->isReady(), 10000);
-    QTest::qWait(300);
+    QVERIFY(ProductHarness::showHome(m_master));
 }
 
 void tst_JobMeasure::cleanupTestCase()

@@ -5,6 +5,7 @@
 #include "AppShell.h"
 #include "GUIAPI/DataManager.h"
 #include "Screens/DaddyPanel.h"
+#include "Screens/JobListScreen.h"
 #include "Screens/ScreenMaster.h"
 #include "SharedSystem/Instrument.h"
 #include "SharedSystem/LocaleHelper.h"
@@ -15,6 +16,7 @@
 #include "support/TestSupport.h"
 
 #include <QFile>
+#include <QtTest>
 
 namespace ProductHarness {
 
@@ -53,6 +55,19 @@ void standInOtherScreens(const QSet<SCREEN_ID_T>& real, std::function<void(SCREE
         standIn->setObjectName(QStringLiteral("StandIn%1").arg(int(id)));
         return standIn;
     });
+}
+
+bool showHome(ScreenMaster* master)
+{
+    master->show();
+    if (!QTest::qWaitFor([] { return DataManager::instance()->getDataInitialized(); }, 20000))
+        return false;
+    // The home screen settles after the link's start-up, which goes home.
+    JobListScreen* home = master->findChild<JobListScreen*>();
+    if (!home || !QTest::qWaitFor([home] { return home->isReady(); }, 10000))
+        return false;
+    QTest::qWait(300);
+    return true;
 }
 
 } // namespace ProductHarness

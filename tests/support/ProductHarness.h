@@ -12,6 +12,8 @@
 
 #include <functional>
 
+class ScreenMaster;
+
 namespace Sim {
 class ServerThread;
 }
@@ -30,6 +32,11 @@ bool startSimulatorAndApplication(Sim::ServerThread& sim, const QString& name, d
 // test sees which one was asked for; the home screen, its covers and `real`
 // are built as the product builds them. `asked` hears of each stand-in.
 void standInOtherScreens(const QSet<SCREEN_ID_T>& real, std::function<void(SCREEN_ID_T)> asked = nullptr);
+
+// Shows the program's window and waits, as the operator would, for the
+// link's start-up and the settled home screen. False when either does not
+// come.
+bool showHome(ScreenMaster* master);
 
 } // namespace ProductHarness
 
