@@ -78,12 +78,15 @@ QFont KLabel::fittedFont(const QString& text) const
     // number of pixels there than on the default device, and whole pixels
     // at that, so a size that fits on paper can still run over.
     const auto metrics = [this](const QFont& font) { return QFontMetrics(font, this); };
+    // The text is drawn inside the margins, so it must fit there.
+    const int width = contentsRect().width();
+    const int height = contentsRect().height();
     if (wordWrap()) {
         // Always the full text, also when a maximum length cuts what shows.
-        const QRect box(0, 0, width(), height());
+        const QRect box(0, 0, width, height);
         while (sizeOf(f) > 1) {
             const QRect needed = metrics(f).boundingRect(box, kWrapFlags, text);
-            if (needed.width() <= width() && needed.height() <= height())
+            if (needed.width() <= width && needed.height() <= height)
                 break;
             setSizeOf(f, sizeOf(f) - 1);
         }
@@ -93,8 +96,8 @@ QFont KLabel::fittedFont(const QString& text) const
     const QFontMetrics start = metrics(f);
     const int textWidth = start.horizontalAdvance(text);
     const int textHeight = start.height();
-    const float widthRatio = textWidth > 0 ? float(width()) / float(textWidth) : 1.0f;
-    const float heightRatio = textHeight > 0 ? float(height()) / float(textHeight) : 1.0f;
+    const float widthRatio = textWidth > 0 ? float(width) / float(textWidth) : 1.0f;
+    const float heightRatio = textHeight > 0 ? float(height) / float(textHeight) : 1.0f;
     const float ratio = std::min(widthRatio, heightRatio);
     if (ratio >= 1.0f)
         return f;
@@ -107,7 +110,7 @@ QFont KLabel::fittedFont(const QString& text) const
     const qreal step = f.pointSize() > 0 ? 0.25 : 1.0;
     while (size > 1.0) {
         const QFontMetrics m = metrics(f);
-        if (m.horizontalAdvance(text) <= width() && m.height() <= qMax(height(), 1))
+        if (m.horizontalAdvance(text) <= width && m.height() <= qMax(height, 1))
             break;
         size = std::max<qreal>(1.0, size - step);
         setSizeOf(f, size);

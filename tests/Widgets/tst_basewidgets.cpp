@@ -131,6 +131,27 @@ private slots:
         QVERIFY(needed.height() <= 60);
     }
 
+    void kLabelFitsInsideItsMargins()
+    {
+        // A title box that buttons overlap at both ends keeps its text in
+        // the middle through margins; the fitting must honour them.
+        for (bool wrap : {false, true}) {
+            KLabel label;
+            label.setWordWrap(wrap);
+            label.resize(221, 66);
+            label.setContentsMargins(59, 0, 59, 0);
+            label.setFont(baseFont());
+            label.setAutoSize(true);
+            const QString text = "Referenzkachel-Prüfung";
+            label.setText(text);
+            const QRect box = label.contentsRect();
+            const QRect needed = QFontMetrics(label.font()).boundingRect(
+                QRect(QPoint(0, 0), box.size()), (wrap ? Qt::TextWordWrap : 0) | Qt::AlignCenter, text);
+            QVERIFY2(needed.width() <= box.width(), qPrintable(QString::number(needed.width())));
+            QVERIFY(needed.height() <= box.height());
+        }
+    }
+
     void kLabelMaxLengthCutsWhatShowsButNotWhatIsFitted()
     {
         KLabel label;
