@@ -1,15 +1,15 @@
 #!/usr/bin/env bash
 # Collects every translatable text of the application into the .ts files of
-# the nine languages (GUIApplication/Language/MarigoldGuiApp_<code>.ts),
+# the product's languages (GUIApplication/Language/MarigoldGuiApp_<code>.ts),
 # dropping texts that no longer exist. Arguments name the languages (all
-# nine by default). New texts arrive unfinished: the test
+# of them by default). New texts arrive unfinished: the test
 # of the translation files fails until each has its translation.
 set -euo pipefail
 here="$(cd "$(dirname "$0")/.." && pwd)"
 app="$here/GUIApplication"
 lupdate_bin="$(command -v lupdate || echo /usr/lib/qt5/bin/lupdate)"
 codes=("$@")
-[ ${#codes[@]} -eq 0 ] && codes=(en es fr de it pt ja ko zh_Hans)
+[ ${#codes[@]} -eq 0 ] && codes=(en es fr de it pt ja ko zh_Hans zh_Hant)
 ts=()
 for c in "${codes[@]}"; do ts+=("$app/Language/MarigoldGuiApp_$c.ts"); done
 "$lupdate_bin" -no-obsolete -locations none -extensions cpp,h,ui \

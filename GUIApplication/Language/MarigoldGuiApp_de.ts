@@ -139,6 +139,53 @@
     </message>
 </context>
 <context>
+    <name>CalibrationWizardPageContainer</name>
+    <message>
+        <source>Tap the self test button to start self testing</source>
+        <translation>Tippen Sie auf „Selbsttest“, um den Selbsttest zu starten</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>Selbsttest</translation>
+    </message>
+    <message>
+        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
+        <translation>Kalibrieren Sie Ihr Gerät mit dem mitgelieferten Weißstandard.</translation>
+    </message>
+    <message>
+        <source>Serial Number: %1</source>
+        <translation>Seriennummer: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
+        <translation>Setzen Sie das Gerät auf den Weißstandard und richten Sie die weiße Linie an der gewünschten Referenz aus.</translation>
+    </message>
+    <message>
+        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Prüfen Sie Ihr Gerät mit dem mitgelieferten Effekt-Referenzstandard. Seriennummer: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
+        <translation>Setzen Sie das Gerät auf den Effekt-Referenzstandard und richten Sie die weiße Linie an der gewünschten Referenz aus</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Führen Sie den Selbsttest mit dem mitgelieferten Weißstandard durch. Seriennummer: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
+        <translation>Setzen Sie das Gerät auf den Weißstandard und richten Sie die weiße Linie an der gewünschten Referenz aus</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Führen Sie den Selbsttest mit dem mitgelieferten Effekt-Referenzstandard durch. Seriennummer: %1</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
+        <translation>Führen Sie den Selbsttest durch, indem Sie das Gerät frei in die Luft halten (nirgends aufgesetzt)</translation>
+    </message>
+</context>
+<context>
     <name>CalibrationWizardScreen</name>
     <message>
         <source>Calibration</source>

@@ -139,6 +139,53 @@
     </message>
 </context>
 <context>
+    <name>CalibrationWizardPageContainer</name>
+    <message>
+        <source>Tap the self test button to start self testing</source>
+        <translation>Tap the self test button to start self testing</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>Self Test</translation>
+    </message>
+    <message>
+        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
+        <translation>Calibrate your instrument by using the white reference tile included with your instrument.</translation>
+    </message>
+    <message>
+        <source>Serial Number: %1</source>
+        <translation>Serial Number: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
+        <translation>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</translation>
+    </message>
+    <message>
+        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
+        <translation>Place the instrument on the effect reference tile by aligning the white line on the desired reference</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
+        <translation>Place the instrument on the white reference tile by aligning the white line on the desired reference</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
+        <translation>Self test your instrument by lifting the instrument into open air (not placed on anything)</translation>
+    </message>
+</context>
+<context>
     <name>CalibrationWizardScreen</name>
     <message>
         <source>Calibration</source>

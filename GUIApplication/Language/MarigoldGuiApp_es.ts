@@ -139,6 +139,53 @@
     </message>
 </context>
 <context>
+    <name>CalibrationWizardPageContainer</name>
+    <message>
+        <source>Tap the self test button to start self testing</source>
+        <translation>Toque el botón Autoprueba para iniciar la autoprueba</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>Autoprueba</translation>
+    </message>
+    <message>
+        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
+        <translation>Calibre su instrumento con el patrón blanco incluido con el instrumento.</translation>
+    </message>
+    <message>
+        <source>Serial Number: %1</source>
+        <translation>Número de serie: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
+        <translation>Coloque el instrumento sobre el patrón blanco alineando la línea blanca con la referencia deseada.</translation>
+    </message>
+    <message>
+        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Verifique su instrumento con la placa de referencia de efecto incluida con el instrumento. Número de serie: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
+        <translation>Coloque el instrumento sobre la placa de referencia de efecto alineando la línea blanca con la referencia deseada</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Realice la autoprueba de su instrumento con el patrón blanco incluido. Número de serie: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
+        <translation>Coloque el instrumento sobre el patrón blanco alineando la línea blanca con la referencia deseada</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Realice la autoprueba de su instrumento con la placa de referencia de efecto incluida. Número de serie: %1</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
+        <translation>Realice la autoprueba levantando el instrumento en el aire (sin apoyarlo en nada)</translation>
+    </message>
+</context>
+<context>
     <name>CalibrationWizardScreen</name>
     <message>
         <source>Calibration</source>

@@ -139,6 +139,53 @@
     </message>
 </context>
 <context>
+    <name>CalibrationWizardPageContainer</name>
+    <message>
+        <source>Tap the self test button to start self testing</source>
+        <translation>Touchez le bouton Autotest pour lancer l&apos;autotest</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>Autotest</translation>
+    </message>
+    <message>
+        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
+        <translation>Étalonnez votre instrument avec l&apos;étalon blanc fourni avec celui-ci.</translation>
+    </message>
+    <message>
+        <source>Serial Number: %1</source>
+        <translation>Numéro de série : %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
+        <translation>Posez l&apos;instrument sur l&apos;étalon blanc en alignant la ligne blanche sur la référence voulue.</translation>
+    </message>
+    <message>
+        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Vérifiez votre instrument avec la plaque de référence à effet fournie avec celui-ci. Numéro de série : %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
+        <translation>Posez l&apos;instrument sur la plaque de référence à effet en alignant la ligne blanche sur la référence voulue</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Lancez l&apos;autotest de votre instrument avec l&apos;étalon blanc fourni avec celui-ci. Numéro de série : %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
+        <translation>Posez l&apos;instrument sur l&apos;étalon blanc en alignant la ligne blanche sur la référence voulue</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Lancez l&apos;autotest de votre instrument avec la plaque de référence à effet fournie avec celui-ci. Numéro de série : %1</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
+        <translation>Lancez l&apos;autotest en tenant l&apos;instrument en l&apos;air (posé sur rien)</translation>
+    </message>
+</context>
+<context>
     <name>CalibrationWizardScreen</name>
     <message>
         <source>Calibration</source>

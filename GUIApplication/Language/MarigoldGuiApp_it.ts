@@ -139,6 +139,53 @@
     </message>
 </context>
 <context>
+    <name>CalibrationWizardPageContainer</name>
+    <message>
+        <source>Tap the self test button to start self testing</source>
+        <translation>Toccare il pulsante Autotest per avviare l&apos;autotest</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>Autotest</translation>
+    </message>
+    <message>
+        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
+        <translation>Calibrare lo strumento con la piastrella bianca di riferimento in dotazione.</translation>
+    </message>
+    <message>
+        <source>Serial Number: %1</source>
+        <translation>Numero di serie: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
+        <translation>Appoggiare lo strumento sulla piastrella bianca allineando la linea bianca al riferimento desiderato.</translation>
+    </message>
+    <message>
+        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Verificare lo strumento con la piastrella di riferimento a effetto in dotazione. Numero di serie: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
+        <translation>Appoggiare lo strumento sulla piastrella di riferimento a effetto allineando la linea bianca al riferimento desiderato</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Eseguire l&apos;autotest dello strumento con la piastrella bianca di riferimento in dotazione. Numero di serie: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
+        <translation>Appoggiare lo strumento sulla piastrella bianca di riferimento allineando la linea bianca al riferimento desiderato</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Eseguire l&apos;autotest dello strumento con la piastrella di riferimento a effetto in dotazione. Numero di serie: %1</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
+        <translation>Eseguire l&apos;autotest sollevando lo strumento in aria (senza appoggiarlo su nulla)</translation>
+    </message>
+</context>
+<context>
     <name>CalibrationWizardScreen</name>
     <message>
         <source>Calibration</source>

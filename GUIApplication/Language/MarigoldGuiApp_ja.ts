@@ -139,6 +139,53 @@
     </message>
 </context>
 <context>
+    <name>CalibrationWizardPageContainer</name>
+    <message>
+        <source>Tap the self test button to start self testing</source>
+        <translation>自己診断ボタンをタップして自己診断を開始します</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>自己診断</translation>
+    </message>
+    <message>
+        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
+        <translation>付属の白色校正板で機器を校正してください。</translation>
+    </message>
+    <message>
+        <source>Serial Number: %1</source>
+        <translation>シリアル番号: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
+        <translation>白線を目的の基準に合わせて、機器を白色校正板の上に置いてください。</translation>
+    </message>
+    <message>
+        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>付属のエフェクト基準板で機器を確認してください。シリアル番号: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
+        <translation>白線を目的の基準に合わせて、機器をエフェクト基準板の上に置いてください</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
+        <translation>付属の白色校正板で機器の自己診断を行います。シリアル番号: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
+        <translation>白線を目的の基準に合わせて、機器を白色校正板の上に置いてください</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>付属のエフェクト基準板で機器の自己診断を行います。シリアル番号: %1</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
+        <translation>機器を空中に持ち上げて（何にも触れない状態で）自己診断を行います</translation>
+    </message>
+</context>
+<context>
     <name>CalibrationWizardScreen</name>
     <message>
         <source>Calibration</source>

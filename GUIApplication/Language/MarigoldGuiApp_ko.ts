@@ -139,6 +139,53 @@
     </message>
 </context>
 <context>
+    <name>CalibrationWizardPageContainer</name>
+    <message>
+        <source>Tap the self test button to start self testing</source>
+        <translation>자가 진단 버튼을 눌러 자가 진단을 시작하십시오</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>자가 진단</translation>
+    </message>
+    <message>
+        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
+        <translation>기기와 함께 제공된 백색 기준판으로 기기를 교정하십시오.</translation>
+    </message>
+    <message>
+        <source>Serial Number: %1</source>
+        <translation>일련 번호: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
+        <translation>흰색 선을 원하는 기준에 맞추어 기기를 백색 교정판 위에 올려 놓으십시오.</translation>
+    </message>
+    <message>
+        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>기기와 함께 제공된 이펙트 기준판으로 기기를 확인하십시오. 일련 번호: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
+        <translation>흰색 선을 원하는 기준에 맞추어 기기를 이펙트 기준판 위에 올려 놓으십시오</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
+        <translation>기기와 함께 제공된 백색 기준판으로 자가 진단을 실행하십시오. 일련 번호: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
+        <translation>흰색 선을 원하는 기준에 맞추어 기기를 백색 기준판 위에 올려 놓으십시오</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>기기와 함께 제공된 이펙트 기준판으로 자가 진단을 실행하십시오. 일련 번호: %1</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
+        <translation>기기를 공중에 들어 올려(아무것에도 닿지 않게) 자가 진단을 실행하십시오</translation>
+    </message>
+</context>
+<context>
     <name>CalibrationWizardScreen</name>
     <message>
         <source>Calibration</source>

@@ -139,6 +139,53 @@
     </message>
 </context>
 <context>
+    <name>CalibrationWizardPageContainer</name>
+    <message>
+        <source>Tap the self test button to start self testing</source>
+        <translation>Toque no botão Autoteste para iniciar o autoteste</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>Autoteste</translation>
+    </message>
+    <message>
+        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
+        <translation>Calibre o seu instrumento com o padrão branco fornecido com o instrumento.</translation>
+    </message>
+    <message>
+        <source>Serial Number: %1</source>
+        <translation>Número de série: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
+        <translation>Coloque o instrumento sobre o padrão branco alinhando a linha branca com a referência pretendida.</translation>
+    </message>
+    <message>
+        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Verifique o seu instrumento com a placa de referência de efeito fornecida com o instrumento. Número de série: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
+        <translation>Coloque o instrumento sobre a placa de referência de efeito alinhando a linha branca com a referência pretendida</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Faça o autoteste do instrumento com o padrão branco fornecido. Número de série: %1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
+        <translation>Coloque o instrumento sobre o padrão branco alinhando a linha branca com a referência pretendida</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>Faça o autoteste do instrumento com a placa de referência de efeito fornecida. Número de série: %1</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
+        <translation>Faça o autoteste levantando o instrumento no ar (sem o apoiar em nada)</translation>
+    </message>
+</context>
+<context>
     <name>CalibrationWizardScreen</name>
     <message>
         <source>Calibration</source>

@@ -139,6 +139,53 @@
     </message>
 </context>
 <context>
+    <name>CalibrationWizardPageContainer</name>
+    <message>
+        <source>Tap the self test button to start self testing</source>
+        <translation>点击自检按钮开始自检</translation>
+    </message>
+    <message>
+        <source>Self Test</source>
+        <translation>自检</translation>
+    </message>
+    <message>
+        <source>Calibrate your instrument by using the white reference tile included with your instrument.</source>
+        <translation>使用仪器随附的白色参考板校准仪器。</translation>
+    </message>
+    <message>
+        <source>Serial Number: %1</source>
+        <translation>序列号：%1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white calibration tile by aligning the white line on the desired reference.</source>
+        <translation>将白线对准所需的参考位置，把仪器放在白色校准板上。</translation>
+    </message>
+    <message>
+        <source>Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>使用仪器随附的效果参考板验证仪器。序列号：%1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the effect reference tile by aligning the white line on the desired reference</source>
+        <translation>将白线对准所需的参考位置，把仪器放在效果参考板上</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1</source>
+        <translation>使用仪器随附的白色参考板进行自检。序列号：%1</translation>
+    </message>
+    <message>
+        <source>Place the instrument on the white reference tile by aligning the white line on the desired reference</source>
+        <translation>将白线对准所需的参考位置，把仪器放在白色参考板上</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1</source>
+        <translation>使用仪器随附的效果参考板进行自检。序列号：%1</translation>
+    </message>
+    <message>
+        <source>Self test your instrument by lifting the instrument into open air (not placed on anything)</source>
+        <translation>将仪器抬起悬空（不放在任何物体上）进行自检</translation>
+    </message>
+</context>
+<context>
     <name>CalibrationWizardScreen</name>
     <message>
         <source>Calibration</source>

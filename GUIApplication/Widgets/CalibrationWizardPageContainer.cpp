@@ -5,16 +5,6 @@
 
 #include <QCoreApplication>
 
-namespace {
-
-// One context for the texts of every set-up's pages.
-QString trc(const char* text)
-{
-    return QCoreApplication::translate("CalibrationWizardPageContainer", text);
-}
-
-} // namespace
-
 CalibrationWizardPageContainer::CalibrationWizardPageContainer(QWidget* parent)
     : BottomDotsPageContainer(parent)
 {
@@ -83,11 +73,11 @@ void CalibrationWizardPageContainer::buildTileSteps(StepText step1, bool effectG
 namespace {
 StepText selfTestTop()
 {
-    return [] { return trc("Tap the self test button to start self testing"); };
+    return [] { return CalibrationWizardPageContainer::tr("Tap the self test button to start self testing"); };
 }
 StepText selfTestButton()
 {
-    return [] { return trc("Self Test"); };
+    return [] { return CalibrationWizardPageContainer::tr("Self Test"); };
 }
 } // namespace
 
@@ -97,11 +87,11 @@ CalibrationWhiteWizardPageContainer::CalibrationWhiteWizardPageContainer(QWidget
     const QString number = tileSerialNumber();
     buildTileSteps(
         [number] {
-            return trc("Calibrate your instrument by using the white reference tile included with your instrument.")
-                + QStringLiteral("\n\n") + trc("Serial Number: %1").arg(number);
+            return CalibrationWizardPageContainer::tr("Calibrate your instrument by using the white reference tile included with your instrument.")
+                + QStringLiteral("\n\n") + CalibrationWizardPageContainer::tr("Serial Number: %1").arg(number);
         },
         false,
-        [] { return trc("Place the instrument on the white calibration tile by aligning the white line on the desired reference."); },
+        [] { return CalibrationWizardPageContainer::tr("Place the instrument on the white calibration tile by aligning the white line on the desired reference."); },
         nullptr, nullptr);
 }
 
@@ -111,11 +101,11 @@ CalibrationReferenceWizardPageContainer::CalibrationReferenceWizardPageContainer
     const QString number = tileSerialNumber();
     buildTileSteps(
         [number] {
-            return trc("Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1")
+            return CalibrationWizardPageContainer::tr("Verify your instrument by using the effect reference tile included with your instrument. Serial Number: %1")
                 .arg(number);
         },
         true,
-        [] { return trc("Place the instrument on the effect reference tile by aligning the white line on the desired reference"); },
+        [] { return CalibrationWizardPageContainer::tr("Place the instrument on the effect reference tile by aligning the white line on the desired reference"); },
         nullptr, nullptr);
 }
 
@@ -125,11 +115,11 @@ CalibrationSelfTestWhiteWizardPageContainer::CalibrationSelfTestWhiteWizardPageC
     const QString number = tileSerialNumber();
     buildTileSteps(
         [number] {
-            return trc("Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1")
+            return CalibrationWizardPageContainer::tr("Self test your instrument by using the white reference tile included with your instrument. Serial Number: %1")
                 .arg(number);
         },
         false,
-        [] { return trc("Place the instrument on the white reference tile by aligning the white line on the desired reference"); },
+        [] { return CalibrationWizardPageContainer::tr("Place the instrument on the white reference tile by aligning the white line on the desired reference"); },
         selfTestTop(), selfTestButton());
 }
 
@@ -139,11 +129,11 @@ CalibrationSelfTestReferenceWizardPageContainer::CalibrationSelfTestReferenceWiz
     const QString number = tileSerialNumber();
     buildTileSteps(
         [number] {
-            return trc("Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1")
+            return CalibrationWizardPageContainer::tr("Self test your instrument by using the effect reference tile included with your instrument. Serial Number: %1")
                 .arg(number);
         },
         true,
-        [] { return trc("Place the instrument on the effect reference tile by aligning the white line on the desired reference"); },
+        [] { return CalibrationWizardPageContainer::tr("Place the instrument on the effect reference tile by aligning the white line on the desired reference"); },
         selfTestTop(), selfTestButton());
 }
 
@@ -152,7 +142,7 @@ CalibrationSelfTestOtherWizardPageContainer::CalibrationSelfTestOtherWizardPageC
 {
     auto* first = new CalibrationStep1PageContents;
     first->setDescriptionText(
-        [] { return trc("Self test your instrument by lifting the instrument into open air (not placed on anything)"); });
+        [] { return CalibrationWizardPageContainer::tr("Self test your instrument by lifting the instrument into open air (not placed on anything)"); });
     first->setBackgroundToLifted();
     createStep(1, false, true)->addPageContents(first);
     addStartStep(2, selfTestTop(), selfTestButton());

@@ -3,7 +3,7 @@
 target_compile_definitions(tst_languageswitch PRIVATE
     MARIGOLD_LANGUAGE_DIR="${CMAKE_SOURCE_DIR}/GUIApplication/Language")
 
-# The screenshot tour takes every screen in all nine languages and fails on
+# The screenshot tour takes every screen in every language and fails on
 # any text that does not fit its box or has no glyphs in the language's
 # font. The long tours cost most, so they start first.
 file(GLOB _tours CONFIGURE_DEPENDS "${CMAKE_CURRENT_LIST_DIR}/tst_tour_*.cpp")

@@ -7,6 +7,7 @@
 #include "Screens/ErrorPopup.h"
 #include "Screens/JobActionsPopup.h"
 #include "Screens/JobListScreen.h"
+#include "Screens/JobMeasureScreen.h"
 #include "Screens/LockScreen.h"
 #include "Screens/MeasuringPopup.h"
 #include "Screens/NotificationPopup.h"
@@ -147,15 +148,17 @@ static QList<Tour::Stop> stops()
     {"issue_2034_battery_warning", [](QWidget* d) { Tour::issue(d, 2034); }},
     {"popup_delete_job", [](QWidget* d) {
          auto* p = Tour::over<DeletePopup>(d);
-         p->setHeaderText("Delete Job?");
-         p->setMessageText("The entire job and all samples will be permanently deleted.");
+         p->setHeaderText(JobListScreen::tr("Delete Job?"));
+         p->setMessageText(JobListScreen::tr("The entire job and all samples will be permanently deleted."));
      }},
     {"popup_override_edit", [](QWidget* d) {
          auto* p = Tour::over<OverridePopup>(d);
-         p->setTitleText("Warning");
-         p->setBodyText("This job was not created on the instrument. Are you sure you want to edit the job?");
-         p->setConfirmButtonText("Edit");
-         p->setCancelButtonText("Cancel");
+         // As the job summary words it.
+         p->setTitleText(JobMeasureScreen::tr("Warning"));
+         p->setBodyText(JobMeasureScreen::tr(
+             "This job was not created on the instrument. Are you sure you want to edit the job?"));
+         p->setConfirmButtonText(JobMeasureScreen::tr("Edit"));
+         p->setCancelButtonText(JobMeasureScreen::tr("Cancel"));
      }},
     {"popup_measuring", [](QWidget* d) { HomeTour::progress(HomeTour::measuring(d), 62); }},
     {"popup_measuring_calculating", [](QWidget* d) {

@@ -7,6 +7,7 @@
 #include "GUIAPI/DataManager.h"
 #include "Screens/JobEditScreens.h"
 #include "Screens/JobKeypadScreen.h"
+#include "Screens/JobMeasureScreen.h"
 #include "Screens/NotificationPopup.h"
 #include "Screens/OverridePopup.h"
 #include "SharedSystem/Instrument.h"
@@ -156,11 +157,12 @@ QList<Tour::Stop> stops()
              loadData();
              new JobNameEditScreen(d);
              auto* popup = new OverridePopup(d);
-             popup->setTitleText(JobKeypadScreen::tr("Warning"));
-             popup->setBodyText(JobKeypadScreen::tr(
+             // The job summary's warning, in its words.
+             popup->setTitleText(JobMeasureScreen::tr("Warning"));
+             popup->setBodyText(JobMeasureScreen::tr(
                  "This job was not created on the instrument. Are you sure you want to edit the job?"));
-             popup->setConfirmButtonText(JobKeypadScreen::tr("Edit"));
-             popup->setCancelButtonText(JobKeypadScreen::tr("Cancel"));
+             popup->setConfirmButtonText(JobMeasureScreen::tr("Edit"));
+             popup->setCancelButtonText(JobMeasureScreen::tr("Cancel"));
              popup->raise();
              popup->show();
          }},

@@ -209,7 +209,7 @@ void Runner::initTestCase()
 
 QStringList productLanguages()
 {
-    return {"en", "es", "fr", "de", "it", "pt", "ja", "ko", "zh_Hans"};
+    return {"en", "es", "fr", "de", "it", "pt", "ja", "ko", "zh_Hans", "zh_Hant"};
 }
 
 namespace {
@@ -242,6 +242,24 @@ QString describe(QWidget* w, const QString& text)
 }
 
 } // namespace
+
+QStringList englishIn(QWidget* root)
+{
+    // A text missing from the translation files shows as English. In a
+    // language of its own script a run of four English words is such a text;
+    // names, codes and units are shorter.
+    static const QRegularExpression sentence("[A-Za-z]{2,}(?:[ ,'-]+[A-Za-z]{2,}){3,}");
+    QStringList faults;
+    auto check = [&](QWidget* w, const QString& text) {
+        if (w->isVisibleTo(root) && sentence.match(text).hasMatch())
+            faults << "English in " + describe(w, text);
+    };
+    for (QLabel* label : root->findChildren<QLabel*>())
+        check(label, Qt::mightBeRichText(label->text()) ? plain(label->text()) : label->text());
+    for (QAbstractButton* button : root->findChildren<QAbstractButton*>())
+        check(button, button->text());
+    return faults;
+}
 
 QStringList textFaults(QWidget* root)
 {
@@ -358,6 +376,12 @@ void Runner::tour()
     const bool strict = !qEnvironmentVariableIsEmpty("MARIGOLD_TOUR_STRICT");
     for (const QString& fault : faults)
         qWarning().noquote() << shotName << ":" << fault;
+    // Only logged: names, notes and messages of the demo data are English
+    // too, so a reviewer reads these lines rather than the test judging them.
+    if (language == "ja" || language == "ko" || language.startsWith("zh")) {
+        for (const QString& text : englishIn(&window))
+            qWarning().noquote() << shotName << ":" << text;
+    }
 
     if (!language.isEmpty()) {
         QApplication::removeTranslator(&translator);

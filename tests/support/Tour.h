@@ -109,8 +109,12 @@ int run(const QList<Stop>& stops, int argc, char** argv);
 // Texts of the visible labels and buttons under `root` that are cut, run
 // out of their box, or have characters no installed font can draw.
 QStringList textFaults(QWidget* root);
+// Visible texts that read as English sentences.
+QStringList englishIn(QWidget* root);
 
-// The nine languages of the product, by the codes of their translation files.
+// The languages of the product, by the codes of their translation files:
+// the nine of LANGUAGE_T and traditional Chinese, which the instrument
+// offers for its keypad's phonetic input.
 QStringList productLanguages();
 
 } // namespace Tour
