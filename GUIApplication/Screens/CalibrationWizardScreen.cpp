@@ -9,6 +9,7 @@
 #include "Screens/CalibrationSensorPopup.h"
 #include "SharedSystem/StringTables.h"
 #include "Widgets/CalibrationWizardPageContainer.h"
+#include "Widgets/Theme.h"
 
 #include <QEvent>
 #include <QKeyEvent>
@@ -32,11 +33,8 @@ CalibrationWizardScreen::CalibrationWizardScreen(CALIBRATION_STATES state, QWidg
     QPalette ground = palette();
     ground.setColor(QPalette::Window, QColor(245, 245, 246));
     setPalette(ground);
-    // The back and check buttons draw their dividers at x 106 and 214 over
-    // the title's box: the text keeps between them. A long translated title
-    // takes two lines before it gets smaller.
-    const QRect title = ui->TxtTitle->geometry();
-    ui->TxtTitle->setContentsMargins(qMax(0, 108 - title.left()), 0, qMax(0, title.right() + 1 - 212), 0);
+    // A long translated title takes two lines before it gets smaller.
+    Theme::keepBetweenHeaderDividers(ui->TxtTitle);
     ui->TxtTitle->setWordWrap(true);
     ui->TxtTitle->setAutoSize(true);
 

@@ -21,6 +21,7 @@ WifiPasswordScreen::WifiPasswordScreen(QWidget* parent)
     ui->setupUi(this);
     ui->BtnBack->setIcon(SettingsPage::backButtonIcon());
     setObjectName(QStringLiteral("WifiPasswordScreen"));
+    Theme::keepBetweenHeaderDividers(ui->TxtTitle);
     ui->TxtTitle->setAutoSize(true);
     ui->BtnDisplayPassword->setIcon(QIcon(QStringLiteral(":/Assets/eye_close.png")));
     createKeypad();

@@ -78,4 +78,10 @@ QLabel* pictureLabel(QWidget* parent, const QString& resource, const QPoint& at,
     return label;
 }
 
+void keepBetweenHeaderDividers(QLabel* title)
+{
+    const QRect box = title->geometry();
+    title->setContentsMargins(qMax(0, 108 - box.left()), 0, qMax(0, box.right() + 1 - 212), 0);
+}
+
 } // namespace Theme

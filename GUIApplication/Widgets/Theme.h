@@ -68,6 +68,11 @@ QFont font(int pointSize, bool bold = false);
 // The same by pixel size, for rows drawn to the pixel.
 QFont pixelFont(int pixels, bool bold = false);
 
+// The back and action buttons of a header (151 wide at x -45 and 214) draw
+// their dividers at x 106 and 214. A title whose box runs under them gets
+// margins that keep its text between the dividers.
+void keepBetweenHeaderDividers(QLabel* title);
+
 // "rgb(r, g, b)" for style sheets.
 QString css(const QColor& colour);
 
