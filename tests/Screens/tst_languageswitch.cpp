@@ -183,6 +183,11 @@ void tst_LanguageSwitch::switchTo(const QString& code)
         if (row->getParam() == code) {
             QTest::mouseClick(row, Qt::LeftButton);
             QTRY_COMPARE(UserParams::getLanguageCode(), code);
+            // The change reaches the application as a posted event, which
+            // posts one to each window: deliver both rounds before reading,
+            // however slow the machine.
+            for (int round = 0; round < 3; ++round)
+                QCoreApplication::sendPostedEvents(nullptr, QEvent::LanguageChange);
             QTest::qWait(100);
             return;
         }
