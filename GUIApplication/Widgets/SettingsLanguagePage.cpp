@@ -58,6 +58,14 @@ void SettingsLanguagePage::onUpdatePage()
 void SettingsLanguagePage::changeEvent(QEvent* event)
 {
     SettingsPage::changeEvent(event);
-    if (event->type() == QEvent::LanguageChange)
+    if (event->type() == QEvent::LanguageChange) {
         setTitle(tr("Language"));
+        // The change polished every style sheet again in the new language's
+        // font: each row takes back the font of the language it names.
+        FlickList* list = getSettingsList();
+        for (int i = 0; i < list->count(); ++i) {
+            if (auto* row = qobject_cast<SettingsListSelectionCheckableItem*>(list->getWidget(i)))
+                row->setFont(LocaleHelper::determineFontFromCountryCode(row->getParam()));
+        }
+    }
 }

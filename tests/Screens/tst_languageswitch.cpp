@@ -9,6 +9,7 @@
 #include "Screens/JobMeasureScreen.h"
 #include "Screens/SampleViewScreen.h"
 #include "Screens/ScreenMaster.h"
+#include "SharedSystem/LocaleHelper.h"
 #include "SharedSystem/UserParams.h"
 #include "Widgets/KLabel.h"
 #include "Widgets/SampleListSelectionItem.h"
@@ -243,6 +244,15 @@ void tst_LanguageSwitch::builtScreensFollowTheLanguageAndComeBack()
             untouched << built.at(i)->metaObject()->className();
     }
     QVERIFY2(stillEnglish.isEmpty(), qPrintable(stillEnglish.join('\n')));
+    // Each language is still named in its own script's font.
+    for (auto* row : m_master->findChildren<SettingsListSelectionCheckableItem*>()) {
+        const QString family = QFontInfo(LocaleHelper::determineFontFromCountryCode(row->getParam())).family();
+        for (QLabel* label : row->findChildren<QLabel*>()) {
+            if (label->text() == row->getText())
+                QVERIFY2(QFontInfo(label->font()).family() == family,
+                         qPrintable(row->getText() + ": " + QFontInfo(label->font()).family()));
+        }
+    }
     QVERIFY2(untouched.isEmpty(), qPrintable(untouched.join(", ")));
 
     switchTo(QStringLiteral("en"));
