@@ -388,7 +388,7 @@
     <name>ImageViewScreen</name>
     <message>
         <source>Camera Images</source>
-        <translation>相機影象</translation>
+        <translation>相機影像</translation>
     </message>
 </context>
 <context>
@@ -748,7 +748,7 @@
     </message>
     <message>
         <source>Camera Images</source>
-        <translation>相機影象</translation>
+        <translation>相機影像</translation>
     </message>
 </context>
 <context>
@@ -766,7 +766,7 @@
     <name>SelfTestListItem</name>
     <message>
         <source>Pass</source>
-        <translation>透過</translation>
+        <translation>通過</translation>
     </message>
     <message>
         <source>Fail</source>
