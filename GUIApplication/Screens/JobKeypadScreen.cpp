@@ -660,7 +660,7 @@ void JobKeypadScreen::changeEvent(QEvent* event)
 
 void JobKeypadScreen::retranslate()
 {
-    const QString title = m_titleSource ? QString() : ui->TxtTitle->defaultText();
+    const QString title = ui->TxtTitle->defaultText();
     ui->retranslateUi(this);
     setTitle(m_titleSource ? m_titleSource() : title);
     updateSpecialText();
