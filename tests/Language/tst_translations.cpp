@@ -3,70 +3,15 @@
 // text, and each language holding every text the English file holds.
 
 #include <QDir>
-#include <QFile>
 #include <QRegularExpression>
 #include <QSet>
-#include <QXmlStreamReader>
 #include <QtTest>
+
+#include "support/TranslationFiles.h"
 
 namespace {
 
-struct Message
-{
-    QString context;
-    QString source;
-    QStringList translations; // one, or one per plural form
-    QString type;             // "", "unfinished", "vanished", "obsolete"
-};
-
-QList<Message> readTs(const QString& path, QString* error)
-{
-    QList<Message> messages;
-    QFile file(path);
-    if (!file.open(QIODevice::ReadOnly)) {
-        *error = "cannot open " + path;
-        return messages;
-    }
-    QXmlStreamReader xml(&file);
-    QString context;
-    Message current;
-    while (!xml.atEnd()) {
-        xml.readNext();
-        if (!xml.isStartElement())
-            continue;
-        const auto name = xml.name();
-        if (name == QLatin1String("context")) {
-            context.clear();
-        } else if (name == QLatin1String("name")) {
-            context = xml.readElementText();
-        } else if (name == QLatin1String("message")) {
-            current = Message();
-            current.context = context;
-        } else if (name == QLatin1String("source")) {
-            current.source = xml.readElementText();
-        } else if (name == QLatin1String("translation")) {
-            current.type = xml.attributes().value("type").toString();
-            // Plural forms nest; a plain translation is its own text.
-            QString text;
-            while (!xml.atEnd()) {
-                xml.readNext();
-                if (xml.isStartElement() && xml.name() == QLatin1String("numerusform")) {
-                    current.translations << xml.readElementText();
-                } else if (xml.isCharacters()) {
-                    text += xml.text();
-                } else if (xml.isEndElement() && xml.name() == QLatin1String("translation")) {
-                    break;
-                }
-            }
-            if (current.translations.isEmpty())
-                current.translations << text;
-            messages << current;
-        }
-    }
-    if (xml.hasError())
-        *error = QString("%1: line %2: %3").arg(path).arg(xml.lineNumber()).arg(xml.errorString());
-    return messages;
-}
+using TranslationFiles::Message;
 
 QStringList markers(const QString& text)
 {
@@ -103,12 +48,13 @@ private slots:
     {
         QFETCH(QString, path);
         QString error;
-        const QList<Message> messages = readTs(path, &error);
+        const QList<Message> messages = TranslationFiles::read(path, &error);
         QVERIFY2(error.isEmpty(), qPrintable(error));
         QVERIFY(!messages.isEmpty());
 
         QString englishError;
-        const QList<Message> english = readTs(QDir(languageDir()).filePath("MarigoldGuiApp_en.ts"), &englishError);
+        const QList<Message> english =
+            TranslationFiles::read(QDir(languageDir()).filePath("MarigoldGuiApp_en.ts"), &englishError);
         QVERIFY2(englishError.isEmpty(), qPrintable(englishError));
         QSet<QString> englishKeys;
         for (const Message& m : english)

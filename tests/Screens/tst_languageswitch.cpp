@@ -24,12 +24,11 @@
 #include "support/ProductHarness.h"
 #include "support/Tour.h"
 #include "support/TestSupport.h"
+#include "support/TranslationFiles.h"
 
 #include <QAbstractButton>
-#include <QFile>
 #include <QLabel>
 #include <QTextDocument>
-#include <QXmlStreamReader>
 #include <QtTest>
 
 namespace {
@@ -40,21 +39,13 @@ namespace {
 QHash<QString, QString> translatedSources(const QString& code)
 {
     QHash<QString, QString> map;
-    QFile file(QStringLiteral(MARIGOLD_LANGUAGE_DIR "/MarigoldGuiApp_%1.ts").arg(code));
-    if (!file.open(QIODevice::ReadOnly))
-        return map;
-    QXmlStreamReader xml(&file);
-    QString source;
-    while (!xml.atEnd()) {
-        if (!xml.readNextStartElement())
-            continue;
-        if (xml.name() == QLatin1String("source")) {
-            source = xml.readElementText();
-        } else if (xml.name() == QLatin1String("translation")) {
-            const QString translation = xml.readElementText();
-            if (!translation.isEmpty() && translation != source && source.trimmed().size() > 1)
-                map.insert(source, translation);
-        }
+    QString error;
+    const auto messages =
+        TranslationFiles::read(QStringLiteral(MARIGOLD_LANGUAGE_DIR "/MarigoldGuiApp_%1.ts").arg(code), &error);
+    for (const TranslationFiles::Message& m : messages) {
+        const QString translation = m.translations.value(0);
+        if (!translation.isEmpty() && translation != m.source && m.source.trimmed().size() > 1)
+            map.insert(m.source, translation);
     }
     return map;
 }
